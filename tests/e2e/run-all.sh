@@ -1,0 +1,17 @@
+#!/usr/bin/env bash
+# Runs the end-to-end scenarios side by side (most of them wait on the checker's timers).
+# Each prints PASS/FAIL lines; figures come out as "FIGURE name: value" lines.
+#   tests/e2e/run-all.sh [NAME...]   (default: every scenarios/*.sh)
+set -uo pipefail
+ROOT=${ROOT:-$(cd "$(dirname "$0")/../.." && pwd)}
+cd "$ROOT"
+export BUILD=${BUILD:-$ROOT/build}
+PARALLEL=${E2E_PARALLEL:-6}
+if [ $# -gt 0 ]; then
+    scenarios=(); for n in "$@"; do scenarios+=("tests/e2e/scenarios/${n%.sh}.sh"); done
+else
+    scenarios=(tests/e2e/scenarios/*.sh)
+fi
+mkdir -p "$BUILD/e2e"
+printf '%s\n' "${scenarios[@]}" |
+    xargs -P "$PARALLEL" -I{} bash -c 'n=$(basename {} .sh); timeout 600 bash {} >$BUILD/e2e/$n.out 2>&1; rc=$?; grep -E "^(PASS|FAIL|FIGURE) " $BUILD/e2e/$n.out; [ $rc -eq 0 ] || grep -qE "^FAIL " $BUILD/e2e/$n.out || echo "FAIL $n: scenario exited $rc (see $BUILD/e2e/$n.out)"'

@@ -1,0 +1,7 @@
+// Waits until ended from outside.
+#include <windows.h>
+
+int WINAPI WinMain(HINSTANCE, HINSTANCE, LPSTR, int) {
+    ::Sleep(INFINITE);
+    return 0;
+}
