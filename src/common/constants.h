@@ -97,6 +97,54 @@ inline constexpr std::int32_t kErrTypeMismatch = 13;
 inline constexpr std::int32_t kErrServerNotFound = -2146697211;
 inline constexpr std::string_view kDateUnavailable = "Service provider is unavailable. Please try later";
 inline constexpr std::string_view kDateFailed = "99999";
+
+// Request strings: keys in the order each builder writes them.
+inline constexpr std::string_view kKeySelect = "Select=";
+inline constexpr std::string_view kKeyCDKey = "&txtCDKey=";
+inline constexpr std::string_view kKeyMajorVersion = "&MajorVersion=";
+inline constexpr std::string_view kKeyCustCode = "&CustCode=";
+inline constexpr std::string_view kKeyProdSubId = "&ProdSubId=";
+inline constexpr std::string_view kKeyMinorVersion = "&MinorVersion=";
+inline constexpr std::string_view kKeyCustID = "&CustID=";
+inline constexpr std::string_view kKeySetupType = "&Setuptype=";
+inline constexpr std::string_view kKeyReportHead = "&ReportHead=";
+inline constexpr std::string_view kPairUserType = "&UserType=Desktop";
+inline constexpr std::string_view kKeyMinorVersionDownload = "&Minorversion=";
+inline constexpr std::string_view kBlank = " ";
+inline constexpr std::string_view kBlankOnWire = "+";
+inline constexpr std::string_view kHeadAmpersand = "&";
+inline constexpr std::string_view kHeadAmpersandOnWire = "~~";
+inline constexpr char kVersionPartSeparator = '.';
+
+// Error sources: each operation's own name (two with their trailing blank).
+inline constexpr std::string_view kSrcInputStringCheck = "fnInputStringCheck";
+inline constexpr std::string_view kSrcInputStringCheckNewLicence = "fnInputStringCheckNewLicence";
+inline constexpr std::string_view kSrcInputStringDownLoad = "fnInputStringDownLoad ";
+inline constexpr std::string_view kSrcInputStringDownLoadNewLicence = "fnInputStringDownLoadNewLicence ";
+inline constexpr std::string_view kSrcGetInfoCheckUpdate = "fnGetInfoCheckUpdate";
+inline constexpr std::string_view kSrcGetInfoCheckUpdateNewLicence = "fnGetInfoCheckUpdateNewLicence";
+inline constexpr std::string_view kSrcGetInfoDownload = "fnGetInfoDownload";
+inline constexpr std::string_view kSrcGetInfoDownloadNewLicence = "fnGetInfoDownloadNewLicence";
+inline constexpr std::string_view kSrcValidateCheckInfo = "prValidateCheckInfo";
+inline constexpr std::string_view kSrcGetExeVersion = "prGetExeVersion";
+inline constexpr std::int32_t kErrOutOfMemory = 7;
+inline constexpr std::string_view kTextOutOfMemory = "Out of memory";
+inline constexpr std::int32_t kErrObjectNotSet = 91;
+inline constexpr std::string_view kTextObjectNotSet = "Object variable or With block variable not set";
+
+// HTTP methods and the request object.
+inline constexpr std::string_view kMethodGet = "GET";
+inline constexpr std::string_view kMethodPost = "POST";
+inline constexpr std::string_view kProgIdXmlHttp = "MSXML2.XMLHTTP";
+// The MSXML 3.0 XMLHTTP class, {F5078F35-C551-11D3-89B9-0000F81FE221}.
+inline constexpr std::string_view kClsidXmlHttp30 = "{F5078F35-C551-11D3-89B9-0000F81FE221}";
+inline constexpr std::int32_t kErrCannotCreateObject = 429;
+inline constexpr std::string_view kTextCannotCreateObject = "ActiveX component can't create object";
+
+// The date written back: month, day, year with the regional separator between.
+inline constexpr int kDateMonthDigits = 2;
+inline constexpr int kDateDayDigits = 2;
+inline constexpr int kDateYearDigits = 4;
 } // namespace service
 
 // ---------------------------------------------------------------- check cycle and tray front end
