@@ -70,6 +70,41 @@ inline constexpr std::string_view kSqlCustomerRow = "Select settings,plan from p
 inline constexpr std::string_view kFilterPrefix = "Plan = ";
 inline constexpr std::string_view kFindPrefix = "plan = ";
 
+// The key the host's protection component expects before it deciphers anything: 7 characters,
+// four of them outside printable ASCII (BEL, section sign, unit separator), as the host fixes it.
+inline constexpr std::string_view kSecretKey = "Q" "\x07" "v" "\xA7" "L" "\x1F" "z";
+inline constexpr std::string_view kProgIdConnection = "ADODB.Connection";
+inline constexpr std::string_view kProgIdRecordset = "ADODB.Recordset";
+inline constexpr std::string_view kColumnSettings = "Settings";
+// Member names called by late binding.
+inline constexpr std::string_view kMemberSecretKey = "SecretKey";
+inline constexpr std::string_view kMemberGetPlanName = "getPlanName";
+inline constexpr std::string_view kMemberDecryptURL = "DecryptURL";
+inline constexpr std::string_view kMemberState = "State";
+inline constexpr std::string_view kMemberOpen = "Open";
+inline constexpr std::string_view kMemberClose = "Close";
+inline constexpr std::string_view kMemberFilter = "Filter";
+inline constexpr std::string_view kMemberEOF = "EOF";
+inline constexpr std::string_view kMemberFields = "Fields";
+inline constexpr std::string_view kMemberItem = "Item";
+inline constexpr std::string_view kMemberValue = "Value";
+inline constexpr std::string_view kMemberFind = "Find";
+// ADO enumeration values the reads use.
+inline constexpr std::int32_t kAdStateClosed = 0;
+inline constexpr std::int32_t kAdStateOpen = 1;
+inline constexpr std::int32_t kAdOpenStatic = 3;
+inline constexpr std::int32_t kAdLockReadOnly = 1;
+inline constexpr std::int32_t kAdFilterNone = 0;
+inline constexpr std::int32_t kAdSearchForward = 1;
+inline constexpr std::int32_t kAdBookmarkFirst = 1;
+inline constexpr std::int32_t kFirstColumn = 0;
+// Customer id: the code of the first character, then at most this many last characters.
+inline constexpr std::size_t kCustIdTailChars = 5;
+inline constexpr char kVersionSeparator = '.';
+// Runtime error 5, raised for the code of the first character of an empty text.
+inline constexpr std::int32_t kErrInvalidCall = 5;
+inline constexpr std::string_view kErrInvalidCallText = "Invalid procedure call or argument";
+
 // Process walk (ANSI entries): the name field holds 260 characters.
 inline constexpr std::size_t kProcessNameChars = 260;
 inline constexpr unsigned kTerminateExitCode = 0;
@@ -219,6 +254,33 @@ inline constexpr std::string_view kMenuClose = "&Close";
 inline constexpr std::string_view kUpdaterExe = "\\KtrLiveUpdate.exe";
 inline constexpr int kShowNormal = 1;    // SW_SHOWNORMAL: patch program
 inline constexpr int kShowMaximized = 3; // SW_SHOWMAXIMIZED: updater
+
+// A patch name is a bare file name: these parts would reach outside the checker folder.
+inline constexpr std::string_view kPathSeparators = "\\/";
+inline constexpr char kDriveMark = ':';
+inline constexpr std::string_view kParentFolder = "..";
+
+// The shell broadcasts this when it (re)starts; the icon is then added again.
+inline constexpr std::string_view kTaskbarCreatedMessage = "TaskbarCreated";
+inline constexpr unsigned kMenuIdCheckUpdate = 101;
+inline constexpr unsigned kMenuIdClose = 102;
+inline constexpr int kIconResourceId = 1;
+inline constexpr int kLabelIdGetUpdate = 201;
+inline constexpr int kLabelIdCancel = 202;
+inline constexpr int kLabelId2 = 203;
+inline constexpr std::string_view kLabelFont = "Arial";
+
+// Artwork (pixels of the 229 x 146 picture) and its colours as 0xRRGGBB.
+inline constexpr std::string_view kArtworkTitle = "Live Update";
+inline constexpr int kArtworkTitleTop = 34, kArtworkTitleHeight = 44;
+inline constexpr int kArtworkTitlePointsTenths = 200; // Arial 20 pt bold
+inline constexpr int kArtworkBarInset = 3;            // around each label, in pixels
+inline constexpr std::uint32_t kArtworkTitleColour = 0x1F4E99;
+inline constexpr std::uint32_t kArtworkRuleColour = 0x8FB3E0;
+inline constexpr std::uint32_t kArtworkBarColour = 0x2A5DB0;
+inline constexpr std::uint32_t kArtworkBarEdgeColour = 0x16376E;
+inline constexpr std::uint32_t kCommandTextColour = 0xFFFFFF;
+inline constexpr std::uint32_t kLabel2TextColour = 0x000000;
 } // namespace tray
 
 // ---------------------------------------------------------------- message box
@@ -267,6 +329,27 @@ inline constexpr std::uint32_t kButtonForeDown = 0xFFFFFF;
 inline constexpr std::uint32_t kCloseBackDown = 0xB0A6BA;  // RGB(176, 166, 186)
 inline constexpr std::uint32_t kAnswerBackDown = 0x808080; // RGB(128, 128, 128)
 inline constexpr std::uint32_t kShapeLine = 0xFFFFFF;
+
+// Key codes the box answers (letters are their upper-case character).
+inline constexpr int kKeyYes = 'Y';
+inline constexpr int kKeyOk = 'O';
+inline constexpr int kKeyNo = 'N';
+inline constexpr int kKeyCancel = 'C';
+
+// The flat button's picture placement; a caller's caption sets it to kPictureNone.
+inline constexpr std::int32_t kPictureNone = 0;
+inline constexpr std::int32_t kPictureLeft = 1;
+inline constexpr int kButtonPicturePx = 16;  // check mark and cross
+inline constexpr int kCancelPicturePx = 12;  // prohibition sign
+inline constexpr std::uint32_t kPictureYellow = 0xFFFF00;
+inline constexpr std::uint32_t kImageRed = 0xFF0000;
+inline constexpr std::uint32_t kImageShadow = 0x808080;
+inline constexpr std::string_view kMessageFont = "Verdana";
+inline constexpr std::string_view kCaptionFont = "MS Sans Serif";
+inline constexpr std::string_view kButtonFont = "MS Sans Serif";
+inline constexpr int kButtonFontTenthsPt = 83;
+// Where a font is missing: same size and weight in a face every Windows has.
+inline constexpr std::string_view kSubstituteFont = "Tahoma";
 
 // Dragging by the title strip: WM_SYSCOMMAND with SC_MOVE | HTCAPTION.
 inline constexpr unsigned kSysCommandMessage = 0x112;
