@@ -180,6 +180,14 @@ inline constexpr std::string_view kTextCannotCreateObject = "ActiveX component c
 inline constexpr int kDateMonthDigits = 2;
 inline constexpr int kDateDayDigits = 2;
 inline constexpr int kDateYearDigits = 4;
+
+// Answer fields: the truth words, in any letter case.
+inline constexpr std::string_view kTextTrue = "True";
+inline constexpr std::string_view kTextFalse = "False";
+// Members of the request object called by name.
+inline constexpr std::string_view kMemberOpen = "open";
+inline constexpr std::string_view kMemberSend = "send";
+inline constexpr std::string_view kMemberResponseText = "responseText";
 } // namespace service
 
 // ---------------------------------------------------------------- check cycle and tray front end
