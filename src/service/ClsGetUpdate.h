@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <memory>
 #include <string>
+#include <string_view>
 
 #include "common/ports.h"
 
@@ -57,7 +58,8 @@ public:
     const std::string& lastAnswer() const { return strAnswer_; }
 
 private:
-    std::string call(std::string_view path, const std::string& strInputString, const char* source);
+    std::string call(std::string_view path, const std::string& strInputString,
+                     std::string_view source);
 
     HttpPort& http_;
     std::string base_;
