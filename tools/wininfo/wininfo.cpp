@@ -3,7 +3,8 @@
 //   wininfo --post HWND MSG WPARAM LPARAM                 PostMessage (numbers: decimal or 0x)
 //   wininfo --dpi                                         the screen's logical dots per inch
 // A window line: hwnd=0x.. pid=N visible=0|1 topmost=0|1 x= y= w= h= cx= cy= class=.. title=..
-// (x, y, w, h: window rectangle in pixels; cx, cy: client size in pixels).
+// (x, y, w, h: window rectangle in pixels; cx, cy: client size in pixels; focus: has the
+// keyboard focus of its thread).
 #include <windows.h>
 
 #include <cstdio>
@@ -30,12 +31,17 @@ void printWindow(HWND hwnd, const char* indent) {
     DWORD pid = 0;
     GetWindowThreadProcessId(hwnd, &pid);
     const LONG_PTR ex = GetWindowLongPtrA(hwnd, GWL_EXSTYLE);
+    // focus=1: this window has the keyboard focus of its thread.
+    GUITHREADINFO gui{};
+    gui.cbSize = sizeof gui;
+    const bool focused = GetGUIThreadInfo(GetWindowThreadProcessId(hwnd, nullptr), &gui) &&
+                         gui.hwndFocus == hwnd;
     std::printf("%shwnd=0x%llx pid=%lu visible=%d topmost=%d x=%ld y=%ld w=%ld h=%ld cx=%ld cy=%ld "
                 "id=%ld enabled=%d focus=%d class=%s title=%s\n",
                 indent, (unsigned long long)(UINT_PTR)hwnd, pid, IsWindowVisible(hwnd) ? 1 : 0,
                 (ex & WS_EX_TOPMOST) ? 1 : 0, r.left, r.top, r.right - r.left, r.bottom - r.top,
                 c.right, c.bottom, (long)GetDlgCtrlID(hwnd), IsWindowEnabled(hwnd) ? 1 : 0,
-                0, cls, title);
+                focused ? 1 : 0, cls, title);
 }
 
 BOOL CALLBACK eachChild(HWND hwnd, LPARAM) {
