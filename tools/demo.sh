@@ -1,0 +1,94 @@
+#!/usr/bin/env bash
+# The checker at work: a demo host folder (stand-alone main product 10.3.0.3 with a customer id),
+# the local update service offering 10.4, the real checker under Wine. Waits for the first check
+# (97.5 s after start), saves a screenshot of the window that slid in, prints what the service
+# received and what the checker wrote, answers "&Get Update" and shows the updater's start.
+set -uo pipefail
+ROOT=${ROOT:-$(cd "$(dirname "$0")/.." && pwd)}
+BUILD=${BUILD:-$ROOT/build}
+. "$ROOT/tests/e2e/lib.sh"
+
+DEMO=$BUILD/demo
+rm -rf "$DEMO"; mkdir -p "$DEMO"
+PIDS=()
+cleanup() {
+    [ -n "${WINEPREFIX:-}" ] && WINEPREFIX=$WINEPREFIX wineserver -k 2>/dev/null
+    local p; for p in "${PIDS[@]}"; do kill "$p" 2>/dev/null; done
+    wait 2>/dev/null
+}
+trap cleanup EXIT
+trap 'echo; echo "stopped."; exit 130' INT TERM
+
+say() { printf '%s\n' "$*"; }
+
+say "== preparing the demo host folder and the update service"
+e2e_template_prefix >/dev/null
+export WINEPREFIX=$DEMO/prefix
+e2e_new_prefix "$WINEPREFIX"
+APP=$DEMO/OrvelZarnPro
+"$NATIVEBIN/hostkit" folder "$APP" --type standalone --version 10.3.0.3 --cust-id X-10042 \
+    --application "ORVEL ZARN PRO" >/dev/null
+cp "$WINBIN/CheckOZProUpdate.exe" "$WINBIN/KtrLiveUpdate.exe" "$APP/"
+
+"$NATIVEBIN/update-server" --port 0 --latest 1=10.4.0.5 --log "$DEMO/requests.log" >"$DEMO/server.out" 2>&1 &
+PIDS+=($!)
+for i in $(seq 50); do grep -q listening "$DEMO/server.out" 2>/dev/null && break; sleep 0.1; done
+PORT=$(sed -n 's/.*127\.0\.0\.1:\([0-9]*\).*/\1/p' "$DEMO/server.out" | head -n1)
+say "update service: http://127.0.0.1:$PORT (offers 10.4.0.5 for product 1)"
+
+if [ -n "${DISPLAY:-}" ] && xdpyinfo >/dev/null 2>&1; then
+    say "display: $DISPLAY (yours)"
+else
+    exec 8>"$DEMO/display"
+    Xvfb -displayfd 8 -screen 0 1024x768x24 -nolisten tcp >/dev/null 2>&1 &
+    PIDS+=($!)
+    exec 8>&-
+    for i in $(seq 100); do [ -s "$DEMO/display" ] && break; sleep 0.1; done
+    export DISPLAY=:$(head -n1 "$DEMO/display")
+    say "display: $DISPLAY (virtual, 1024x768)"
+fi
+
+say "== starting CheckOZProUpdate.exe in $APP"
+(cd "$APP" && CHECKER_UPDATE_SERVER=http://127.0.0.1:$PORT WINEDEBUG=-all exec wine "$APP/CheckOZProUpdate.exe") \
+    >"$DEMO/checker.out" 2>&1 &
+CHECKER=$!
+PIDS+=($CHECKER)
+start=$(date +%s)
+
+# Progress until the window has slid in and stands topmost.
+while :; do
+    kill -0 "$CHECKER" 2>/dev/null || { echo; say "the checker ended unexpectedly"; exit 1; }
+    now=$(date +%s); left=$(awk -v s="$start" -v n="$now" 'BEGIN { l = s + 97.5 - n; if (l < 0) l = 0; printf "%d", l }')
+    line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
+    if [ "$(e2e_field "$line" topmost)" = 1 ]; then break; fi
+    if [ "$(e2e_field "$line" visible)" = 1 ]; then
+        printf '\r  window sliding in: top at %s px ...            ' "$(e2e_field "$line" y)"
+    elif [ "$left" -gt 0 ]; then
+        printf '\r  first update check in %3d s                    ' "$left"
+    else
+        printf '\r  checking with the update service ...          '
+    fi
+    [ $((now - start)) -gt 400 ] && { echo; say "no window after 400 s"; exit 1; }
+    sleep 1
+done
+echo
+say "window shown after $(( $(date +%s) - start )) s: $line"
+SHOT=$DEMO/shown-window.png
+import -display "$DISPLAY" -window root "$SHOT" 2>/dev/null
+say "screenshot: $SHOT"
+say "== requests the update service received"
+cat "$DEMO/requests.log"
+say "== $APP/Update.INI"
+tr -d '\r' <"$APP/Update.INI"
+
+say "== answering \"&Get Update\""
+x=$(e2e_field "$line" x); y=$(e2e_field "$line" y)
+# The label lies on the left button bar: 120, 1785 twips from the client's top-left, 1500 x 255.
+xdotool mousemove $((x + (120 + 750) / 15)) $((y + (1785 + 127) / 15)) click 1
+for i in $(seq 60); do kill -0 "$CHECKER" 2>/dev/null || break; sleep 0.5; done
+if kill -0 "$CHECKER" 2>/dev/null; then say "the checker is still running"; exit 1; fi
+say "checker ended"
+for i in $(seq 20); do [ -s "$APP/started.log" ] && break; sleep 0.5; done
+say "== updater start recorded by KtrLiveUpdate.exe (EXE|SHOW-STATE|COMMAND-LINE; 3 = maximized)"
+tr -d '\r' <"$APP/started.log" 2>/dev/null || say "(no started.log)"
+say "screenshot of the shown window: $SHOT"
