@@ -1,0 +1,127 @@
+#!/usr/bin/env bash
+# Figures of the checker against a baseline tray program (tools/baseline), under the same Wine,
+# in one run. A bench-only build shortens the check tick so that many ticks pass quickly.
+set -uo pipefail
+ROOT=${ROOT:-$(cd "$(dirname "$0")/.." && pwd)}
+BUILD=${BUILD:-$ROOT/build}
+. "$ROOT/tests/e2e/lib.sh"
+STARTS=${BENCH_STARTS:-10}
+TICK_MS=${BENCH_TICK_MS:-65}
+IDLE_TICKS=${BENCH_IDLE_TICKS:-150}
+
+echo "== bench build (Timer1 = $TICK_MS ms; the product keeps 6500 ms)"
+cmake -S "$ROOT" -B "$BUILD/bench-windows" -DCMAKE_BUILD_TYPE=Release \
+    -DCMAKE_TOOLCHAIN_FILE="$ROOT/cmake/mingw-w64-x86_64.cmake" -DCHECKER_BENCH_TIMER1_MS="$TICK_MS" >/dev/null
+cmake --build "$BUILD/bench-windows" -j2 --target CheckOZProUpdate >/dev/null || exit 1
+BENCH_EXE=$BUILD/bench-windows/CheckOZProUpdate.exe
+
+e2e_template_prefix >/dev/null
+E2E_NAME=bench
+SCEN=$E2E_ROOT/bench
+rm -rf "$SCEN"; mkdir -p "$SCEN"
+export WINEPREFIX=$SCEN/prefix
+e2e_new_prefix "$WINEPREFIX"
+exec 8>"$SCEN/display"
+Xvfb -displayfd 8 -screen 0 1024x768x24 -nolisten tcp >/dev/null 2>&1 &
+E2E_PIDS=($!)
+exec 8>&-
+for i in $(seq 100); do [ -s "$SCEN/display" ] && break; sleep 0.1; done
+export DISPLAY=:$(head -n1 "$SCEN/display")
+trap e2e_end EXIT
+
+APP=$SCEN/app
+"$NATIVEBIN/hostkit" folder "$APP" --type standalone --version 10.3.0.3 --cust-id X-10042 >/dev/null
+cp "$WINBIN/CheckOZProUpdate.exe" "$APP/"
+cp "$BENCH_EXE" "$APP/CheckOZProUpdate-bench.exe"
+cp "$WINBIN/baseline-tray.exe" "$APP/"
+
+server() { # update-server options; sets PORT
+    [ -n "${SERVER_PID:-}" ] && kill "$SERVER_PID" 2>/dev/null
+    "$NATIVEBIN/update-server" --port 0 --log "$SCEN/requests.log" "$@" >"$SCEN/server.out" 2>&1 &
+    SERVER_PID=$!; E2E_PIDS+=($SERVER_PID)
+    for i in $(seq 100); do grep -q listening "$SCEN/server.out" 2>/dev/null && break; sleep 0.1; done
+    PORT=$(sed -n 's/.*127\.0\.0\.1:\([0-9]*\).*/\1/p' "$SCEN/server.out" | head -n1)
+    export CHECKER_UPDATE_SERVER=http://127.0.0.1:$PORT
+}
+
+launch() { # exe [env...]; sets PID
+    wineserver -k 2>/dev/null; wineserver -w 2>/dev/null
+    (cd "$APP" && exec env "${@:2}" wine "$APP/$1") >/dev/null 2>&1 &
+    PID=$!; E2E_PIDS+=($PID)
+    T0=$(date +%s.%N)
+}
+
+# Seconds from start until Wine's tray window shows an icon.
+time_to_icon() {
+    local i
+    for i in $(seq 1500); do
+        xdotool search --name 'Wine System Tray' >/dev/null 2>&1 && { e2e_since "$T0"; return 0; }
+        sleep 0.02
+    done
+    echo NaN
+}
+
+median() { sort -g | awk '{ a[NR] = $1 } END { if (NR % 2) print a[(NR + 1) / 2]; else printf "%.3f\n", (a[NR / 2] + a[NR / 2 + 1]) / 2 }'; }
+private_kib() { awk '/^Private_(Clean|Dirty)/ { s += $2 } END { print s }' "/proc/$1/smaps_rollup" 2>/dev/null; }
+cpu_ticks() { awk '{ print $14 + $15 }' "/proc/$1/stat" 2>/dev/null; }
+clk=$(getconf CLK_TCK)
+
+server --latest 1=10.3.0.3 --date '<html>not a date</html>'   # no update: nothing shown
+
+echo "== start-up to icon, $STARTS starts each"
+declare -A startup memory cpu
+for prog in CheckOZProUpdate.exe baseline-tray.exe; do
+    : >"$SCEN/times"
+    for n in $(seq "$STARTS"); do
+        launch "$prog"
+        time_to_icon >>"$SCEN/times"
+        echo >>"$SCEN/times"
+        if [ "$n" = "$STARTS" ]; then
+            sleep 3
+            memory[$prog]=$(private_kib "$PID")
+        fi
+    done
+    startup[$prog]=$(grep . "$SCEN/times" | median)
+done
+
+echo "== CPU over $IDLE_TICKS ticks of $TICK_MS ms (checks every 15th tick end at the date query)"
+for prog in CheckOZProUpdate-bench.exe baseline-tray.exe; do
+    launch "$prog" BASELINE_TICK_MS="$TICK_MS"
+    time_to_icon >/dev/null; sleep 1
+    c0=$(cpu_ticks "$PID")
+    sleep "$(awk -v n="$IDLE_TICKS" -v t="$TICK_MS" 'BEGIN { print n * t / 1000 }')"
+    c1=$(cpu_ticks "$PID")
+    cpu[$prog]=$(awk -v a="$c0" -v b="$c1" -v k="$clk" -v n="$IDLE_TICKS" 'BEGIN { printf "%.3f", (b - a) * 1000 / k / n }')
+done
+
+echo "== one check that finds an update: requests and slide-in (1024x768)"
+: >"$SCEN/requests.log"
+server --latest 1=10.4.0.5
+launch CheckOZProUpdate-bench.exe
+slide_start=""; slide=NaN
+for i in $(seq 1200); do
+    line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
+    if [ -z "$slide_start" ] && [ "$(e2e_field "$line" visible)" = 1 ]; then
+        slide_start=$(date +%s.%N)
+        requests=$(grep -c . "$SCEN/requests.log")
+    fi
+    if [ -n "$slide_start" ] && [ "$(e2e_field "$line" topmost)" = 1 ]; then slide=$(e2e_since "$slide_start"); break; fi
+    sleep 0.1
+done
+
+size() { stat -c %s "$1"; }
+imports() { x86_64-w64-mingw32-objdump -p "$1" | sed -n 's/.*DLL Name: //p' | tr 'A-Z' 'a-z' | sort -u | tr '\n' ' '; }
+ratio() { awk -v a="$1" -v b="$2" 'BEGIN { if (b + 0 == 0) print "-"; else printf "%.2f", a / b }'; }
+
+echo
+{
+    echo "figure|checker|baseline|ratio"
+    echo "start to icon, median of $STARTS (s)|${startup[CheckOZProUpdate.exe]}|${startup[baseline-tray.exe]}|$(ratio "${startup[CheckOZProUpdate.exe]}" "${startup[baseline-tray.exe]}")"
+    echo "private memory after start-up (KiB)|${memory[CheckOZProUpdate.exe]}|${memory[baseline-tray.exe]}|$(ratio "${memory[CheckOZProUpdate.exe]}" "${memory[baseline-tray.exe]}")"
+    echo "CPU per tick (ms)|${cpu[CheckOZProUpdate-bench.exe]}|${cpu[baseline-tray.exe]}|$(ratio "${cpu[CheckOZProUpdate-bench.exe]}" "${cpu[baseline-tray.exe]}")"
+    echo "slide-in, 1024x768 (s)|$slide|-|-"
+    echo "HTTP requests per check|${requests:-NaN}|-|-"
+    echo "executable size (bytes)|$(size "$WINBIN/CheckOZProUpdate.exe")|$(size "$WINBIN/baseline-tray.exe")|$(ratio "$(size "$WINBIN/CheckOZProUpdate.exe")" "$(size "$WINBIN/baseline-tray.exe")")"
+} | column -t -s'|' -o ' | '
+echo "imported DLLs, checker:  $(imports "$WINBIN/CheckOZProUpdate.exe")"
+echo "imported DLLs, baseline: $(imports "$WINBIN/baseline-tray.exe")"
