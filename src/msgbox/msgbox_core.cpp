@@ -85,6 +85,11 @@ int capMessageHeight(int fittedHeight, int screenHeight, bool centred) {
     return std::max(limit, kMsgHeight);
 }
 
+void prCentreInMDIClient(MsgBoxModel& box) {
+    box.windowLeft = kCentredLeft;
+    box.windowTop = (kCentredSpan - box.windowHeight) / 2;
+}
+
 void activateLayout(MsgBoxModel& box, int fittedMessageHeight) {
     box.messageHeight = fittedMessageHeight;
     const int d = fittedMessageHeight - kGrowthBase;
@@ -100,8 +105,7 @@ void activateLayout(MsgBoxModel& box, int fittedMessageHeight) {
     if (!box.btnNo) box.cmdNo.visible = false;
 
     if (box.CentreinMDIClient) {
-        box.windowLeft = kCentredLeft;
-        box.windowTop = (kCentredSpan - box.windowHeight) / 2;
+        prCentreInMDIClient(box);
     } else {
         box.windowLeft = kUncentredLeft;
         box.windowTop = kUncentredTop;

@@ -61,6 +61,9 @@ void applyCaptionPictures(MsgBoxModel& box, std::string_view caption1, std::stri
 // `screenHeight` twips high (0: unknown, no limit). At least one design line.
 int capMessageHeight(int fittedHeight, int screenHeight, bool centred);
 
+// The fixed placement rule: left 4500, top (9600 - window height) / 2, in screen twips.
+void prCentreInMDIClient(MsgBoxModel& box);
+
 // Steps 3 to 6 of becoming active: growth by the fitted message height, the border, hiding the
 // buttons the style does not keep, placement.
 void activateLayout(MsgBoxModel& box, int fittedMessageHeight);

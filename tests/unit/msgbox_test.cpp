@@ -24,7 +24,7 @@ MsgBoxModel shown(std::int32_t style, std::string_view c1 = "", std::string_view
 struct Shown {
     bool visible;
     int left;
-    std::string caption;
+    std::string_view caption;
 };
 Shown of(const ButtonModel& b) { return {b.visible, b.left, b.caption}; }
 bool operator==(const Shown& a, const Shown& b) {
