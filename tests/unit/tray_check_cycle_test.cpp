@@ -185,7 +185,9 @@ TEST(CheckCycle, ATickStartedByTheMessageRunsOfAnotherIsSkipped) {
     Rig rig;
     int nested = 0;
     rig.pump.onRun = [&] {
-        if (nested++ == 0) EXPECT_EQ(rig.tick(), TickOutcome::Skipped);
+        if (nested++ == 0) {
+            EXPECT_EQ(rig.tick(), TickOutcome::Skipped);
+        }
     };
     EXPECT_EQ(rig.tick(), TickOutcome::Done);
     EXPECT_EQ(rig.cycle.intTimerTicks, 1);
@@ -247,7 +249,7 @@ TEST(PatchPickup, VersionRules) {
 }
 
 TEST(PatchPickup, MissingOrHostilePatchDoesNothingAndTheCheckStillRuns) {
-    for (const std::string name :
+    for (const std::string& name :
          {std::string("..\\..\\evil.exe"), std::string("sub\\p.exe"), std::string("C:p.exe"),
           std::string("/tmp/p.exe"), std::string("..")}) {
         Rig rig;

@@ -70,7 +70,7 @@ TEST(ResultDisplay, OncePerCalendarDay) {
 }
 
 TEST(ResultDisplay, NoUpdateLeavesEverythingAlone) {
-    for (const std::string answer :
+    for (const std::string& answer :
          {std::string("OK,10.4.0.5,x,False"), std::string("OK,10.4.0.5,x,0"),
           // Not check answers at all: error pages, a proxy's login page, short answers.
           std::string("<html><body>Login required</body></html>"), std::string("OK,10.4,x"),
@@ -85,7 +85,7 @@ TEST(ResultDisplay, NoUpdateLeavesEverythingAlone) {
 }
 
 TEST(ResultDisplay, DamagedStoredDateCountsAsAnotherDay) {
-    for (const std::string value : {std::string(""), std::string("garbage"),
+    for (const std::string& value : {std::string(""), std::string("garbage"),
                                     std::string("31/13/2026"), std::string("\0\0", 2)}) {
         Display d;
         d.stored(value);
@@ -203,8 +203,9 @@ TEST(Commands, StepsInOrderAndOnlyTwoStartTheUpdater) {
         const bool updater = c == UserCommand::GetUpdate || c == UserCommand::CheckUpdate;
         EXPECT_EQ(order, std::vector<std::string>{"icon removed, updater started: " +
                                                   std::to_string(updater ? 1 : 0)});
-        if (updater)
+        if (updater) {
             EXPECT_EQ(processes.started.at(0), std::make_pair(kApp + "\\KtrLiveUpdate.exe", 3));
+        }
         // The title name has no extension: only images ending in it exactly are ended.
         EXPECT_EQ(processes.terminated, std::vector<std::uint32_t>{8});
     }
