@@ -188,6 +188,10 @@ inline constexpr std::string_view kTextFalse = "False";
 inline constexpr std::string_view kMemberOpen = "open";
 inline constexpr std::string_view kMemberSend = "send";
 inline constexpr std::string_view kMemberResponseText = "responseText";
+inline constexpr std::string_view kMemberStatus = "status";
+// No answer at all to a request (INET_E_DATA_NOT_AVAILABLE, 0x800C0007).
+inline constexpr std::int32_t kErrNoAnswer = -2146697209;
+inline constexpr std::string_view kTextNoAnswer = "No data is available for the requested resource";
 } // namespace service
 
 // ---------------------------------------------------------------- check cycle and tray front end
