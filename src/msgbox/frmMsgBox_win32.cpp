@@ -244,8 +244,6 @@ void frmMsgBox::ShowModal() {
 
     ::ShowWindow(hwnd_, SW_SHOW);
     ::SetForegroundWindow(hwnd_);
-    // The tab order's first button has the focus until the activation moves it.
-    cmdOK.setFocus();
     if (!activated_) Form_Activate();
 
     MSG msg;

@@ -109,6 +109,9 @@ LRESULT MsgBoxPart::WndProc(UINT message, WPARAM wParam, LPARAM lParam) {
         }
         return 0;
     }
+    case WM_COMMAND:
+        // A panel passes its buttons' clicks on to the window that holds it.
+        return ::SendMessageW(::GetParent(hwnd_), message, wParam, lParam);
     case WM_LBUTTONDOWN:
     case WM_RBUTTONDOWN:
     case WM_MBUTTONDOWN:
