@@ -33,7 +33,15 @@ public:
         invokeMethod(object_.Get(), kMemberOpen, std::move(args));
     }
 
-    void send() override { invokeMethod(object_.Get(), kMemberSend); }
+    void send() override {
+        invokeMethod(object_.Get(), kMemberSend);
+        // A connection closed before any answer: Windows fails the send, but some HTTP layers
+        // (Wine's) return with status 0 and no body, which would pass for an empty answer.
+        // Status 0 is no HTTP status at all, so this examines no server's status code.
+        const UniqueVariant status = getProperty(object_.Get(), kMemberStatus);
+        if (status.get()->vt == VT_I4 && status.get()->lVal == 0)
+            throw CheckerError(kErrNoAnswer, std::string(kMemberSend), std::string(kTextNoAnswer));
+    }
 
     std::string responseText() override {
         const UniqueVariant text = getProperty(object_.Get(), kMemberResponseText);

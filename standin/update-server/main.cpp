@@ -70,8 +70,20 @@ int main(int argc, char** argv) {
     }
 
     httplib::Server server;
+    // Every request line goes to the log before it is answered. A request line the library
+    // refuses (a second "?" in the query, say) never reaches routing; its 400 passes through the
+    // error handler instead. The logger runs once at the end of every answer.
+    static thread_local bool logged = false;
+    server.set_error_handler(httplib::Server::HandlerWithResponse(
+        [&](const httplib::Request& req, httplib::Response&) {
+            if (!logged) log.write(req.method, req.target);
+            logged = true;
+            return httplib::Server::HandlerResponse::Unhandled;
+        }));
+    server.set_logger([](const httplib::Request&, const httplib::Response&) { logged = false; });
     server.set_pre_routing_handler([&](const httplib::Request& req, httplib::Response& res) {
         log.write(req.method, req.target);
+        logged = true;
         // The date query is a POST without a body and often without a length, which the
         // library's own POST routing refuses with 400; it is answered here, before that.
         if (req.method == "POST" && req.path == kDatePath) {

@@ -1,5 +1,7 @@
 #include "options.h"
 
+#include <fstream>
+#include <iterator>
 #include <stdexcept>
 #include <string>
 
@@ -18,7 +20,8 @@ Endpoints (exact paths, letter case included):
   GET  /Support/downloads/UpdateString.asp?QUERY         download, customer code
   GET  /Support/downloads/OZProUpdateString.asp?QUERY    download, customer id
   POST /SUPPORT/Downloads/QVLDATETime.asp                 the service's date
-Any other path or method gets 404.
+Any other path or method gets 404. A request line the HTTP library refuses (such as a
+second "?" in the query) gets 400 with an empty body; it is logged all the same.
 
 Check and download answers: four comma-separated fields
   SELECT,LATEST,INSTALLED,FLAG
@@ -33,6 +36,7 @@ Options:
   --port N               port to listen on (default 8080; 0 picks a free one)
   --latest PRODUCT=VER   latest version of product id PRODUCT, e.g. 1=10.4.0.5 (repeatable)
   --answer TEXT          every check and download answers TEXT
+  --answer-file FILE     every check and download answers the bytes of FILE
   --date TEXT            the date endpoint answers TEXT
   --status CODE          every answer carries HTTP status CODE (body unchanged)
   --delay-ms N           wait N ms before answering
@@ -80,6 +84,11 @@ Options parseOptions(int argc, char** argv) {
             o.latest[v.substr(0, eq)] = version;
         } else if (arg == "--answer") {
             o.answer = value();
+        } else if (arg == "--answer-file") {
+            const std::string path = value();
+            std::ifstream in(path, std::ios::binary);
+            if (!in) throw std::invalid_argument("cannot read " + path);
+            o.answer = std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
         } else if (arg == "--date") {
             o.date = value();
         } else if (arg == "--status") {
