@@ -1,5 +1,6 @@
 #include "service/ClsGetUpdate.h"
 
+#include <initializer_list>
 #include <new>
 #include <string_view>
 #include <utility>

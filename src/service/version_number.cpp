@@ -158,25 +158,22 @@ double fnVersionValue(std::string_view text) {
 }
 
 std::optional<bool> fnTruthValue(std::string_view text) {
-    // Blanks around the word or number are allowed, as the runtime's conversion allows them.
-    const auto first = text.find_first_not_of(' ');
-    if (first == std::string_view::npos) return std::nullopt;
-    const auto last = text.find_last_not_of(' ');
-    const std::string_view word = text.substr(first, last - first + 1);
-
     auto equalsNoCase = [&](std::string_view expected) {
-        if (word.size() != expected.size()) return false;
-        for (std::size_t i = 0; i < word.size(); ++i)
-            if (upper(word[i]) != upper(expected[i])) return false;
+        if (text.size() != expected.size()) return false;
+        for (std::size_t i = 0; i < text.size(); ++i)
+            if (upper(text[i]) != upper(expected[i])) return false;
         return true;
     };
     if (equalsNoCase(service::kTextTrue)) return true;
     if (equalsNoCase(service::kTextFalse)) return false;
 
-    // A number must be the whole field; tabs and line feeds are not allowed inside it here.
-    if (word.find_first_of("\t\n") != std::string_view::npos) return std::nullopt;
-    const auto inner = word.find(' ');
-    if (inner != std::string_view::npos) return std::nullopt;
+    // A number must be the whole field; blanks may stand around it, as a number conversion
+    // allows, but not inside it, and no other white space anywhere.
+    const auto first = text.find_first_not_of(' ');
+    if (first == std::string_view::npos) return std::nullopt;
+    const auto last = text.find_last_not_of(' ');
+    const std::string_view word = text.substr(first, last - first + 1);
+    if (word.find_first_of(" \t\n") != std::string_view::npos) return std::nullopt;
     const Number n = readNumber(word);
     if (!n.any || !n.complete) return std::nullopt;
     return n.value != 0;

@@ -61,7 +61,7 @@ TEST(TruthValue, WordsInAnyCaseOrNumbers) {
     EXPECT_EQ(fnTruthValue("True"), true);
     EXPECT_EQ(fnTruthValue("tRuE"), true);
     EXPECT_EQ(fnTruthValue("FALSE"), false);
-    EXPECT_EQ(fnTruthValue(" True "), true);
+    EXPECT_EQ(fnTruthValue(" 1 "), true);
     EXPECT_EQ(fnTruthValue("0"), false);
     EXPECT_EQ(fnTruthValue("0.0"), false);
     EXPECT_EQ(fnTruthValue("-1"), true);
@@ -69,7 +69,7 @@ TEST(TruthValue, WordsInAnyCaseOrNumbers) {
     EXPECT_EQ(fnTruthValue("&H0"), false);
     EXPECT_EQ(fnTruthValue("&HA"), true);
 
-    for (const std::string& bad : std::vector<std::string>{"", " ", "Yes", "Truee", "1x", "1 2", "1.2.3", "&H", "+", ".",
+    for (const std::string& bad : std::vector<std::string>{"", " ", " True", "False ", "Yes", "Truee", "1x", "1 2", "1.2.3", "&H", "+", ".",
                                   "True\r\n", "1\t", std::string("1\0", 2)})
         EXPECT_FALSE(fnTruthValue(bad).has_value()) << "[" << bad << "]";
 }

@@ -56,6 +56,16 @@ check "dropped connection: the request was sent" \
     svc_logged "GET /SUPPORT/Downloads/CheckOZProUpdate.asp?Select=1&CustID=1&MajorVersion=10.3&ProdSubId=S&MinorVersion=3"
 svc_stop
 
+# A slow service: the call waits for the whole answer (no time-out of the client's own).
+svc_start --delay-ms 3000 --latest 1=10.4.0.5
+t0=$(date +%s.%N)
+out=$(svc_probe check "$BASE" 1 S 10.3 3 K)
+took=$(e2e_since "$t0")
+figure "call to a service that answers after 3 s: $took s"
+check "slow service: the call waits and gets the answer" grep -qx "UPDATE true" <<<"$out"
+check "slow service: not before the answer was given" awk -v t="$took" 'BEGIN { exit !(t >= 3) }'
+svc_stop
+
 # One instance, two calls: the second fails after the service has gone.
 svc_start --latest 1=10.4.0.5
 flag=$SCEN/go
