@@ -6,8 +6,10 @@ e2e_begin msgbox-layout 1280x1024
 MB_TPP=$(mb_tpp)
 
 pixel() { # png x y -> "r,g,b"
-    convert "$1" -crop "1x1+$2+$3" -depth 8 txt:- 2>/dev/null | sed -n 's/.*srgb(\([0-9,]*\)).*/\1/p;s/.*rgb(\([0-9,]*\)).*/\1/p' | head -n1
+    convert "$1" -crop "1x1+$2+$3" -depth 8 txt:- 2>/dev/null | sed -n 's/^0,0: *(\([0-9]*,[0-9]*,[0-9]*\).*/\1/p'
 }
+# Pixels for a position in twips, rounded as the box converts it.
+px() { echo $((($1 + MB_TPP / 2) / MB_TPP)); }
 
 # ---- one line, not centred
 if mb_show --style 3 --message "One line"; then
@@ -19,8 +21,8 @@ if mb_show --style 3 --message "One line"; then
     check "one-line window is 1320 high (is $one_h)" [ "$one_h" -eq 1320 ]
     check "one-line buttons at top 780" \
         [ "$(mb_top $MB_OK)|$(mb_top $MB_NO)|$(mb_top $MB_CANCEL)" = "780|780|780" ]
-    check "not centred: top-left at (5000, 5000) on 1280x1024" \
-        [ "$(($(mb_field "" x) * MB_TPP)),$(($(mb_field "" y) * MB_TPP))" = "5000,5000" ]
+    check "not centred: top-left at (5000, 5000) twips on 1280x1024" \
+        [ "$(mb_field "" x),$(mb_field "" y)" = "$(px 5000),$(px 5000)" ]
     check "width 6855" [ "$(($(mb_field "" w) * MB_TPP))" -eq 6855 ]
     check "not topmost unless asked" [ "$(mb_field "" topmost)" = 0 ]
     shot=$(e2e_screenshot one-line)
