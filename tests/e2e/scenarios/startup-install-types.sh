@@ -13,7 +13,7 @@ run_type() {
     [ -n "${EDIT_CLIENT_INI:-}" ] && sed -i 's/\\\r$/\r/; s/\\$//' "$APP/CLIENT.INI"
     : >"$HOSTSTANDIN_LOG"
     e2e_start_checker
-    if e2e_wait_exit 8; then r=ended; else r=running; fi
+    if e2e_wait_exit 20; then r=ended; else r=running; fi
 }
 
 opened() { grep -a -o 'Data Source=[^;]*' "$HOSTSTANDIN_LOG" 2>/dev/null | head -n1 | sed 's/Data Source=//'; }
