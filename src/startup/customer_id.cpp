@@ -1,6 +1,7 @@
 #include "startup/customer_id.h"
 
 #include <cstdlib>
+#include <algorithm>
 #include <cmath>
 #include <limits>
 #include <string>

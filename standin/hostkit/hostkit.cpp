@@ -151,7 +151,7 @@ void makeExe(const fs::path& path, const std::optional<std::string>& version, co
 }
 
 // ---- databases
-struct DbSpec {
+struct DbLayout {
     std::string password{kDatabasePassword};
     bool noTable = false;
     std::vector<std::string> columns{"Plan", "Settings"};
@@ -169,49 +169,49 @@ std::int32_t planOf(const std::string& text) {
 }
 
 // Takes one db option at args.pos - 1; false when it is not one.
-bool dbOption(const std::string& opt, Args& args, DbSpec& spec) {
+bool dbOption(const std::string& opt, Args& args, DbLayout& layout) {
     auto planText = [&](const std::string& what) {
         const std::string v = args.next(what);
         const auto eq = v.find('=');
         if (eq == std::string::npos) die(what + " needs PLAN=TEXT");
         return std::make_pair(planOf(v.substr(0, eq)), v.substr(eq + 1));
     };
-    if (opt == "--password") spec.password = args.next("--password TEXT");
-    else if (opt == "--no-table") spec.noTable = true;
+    if (opt == "--password") layout.password = args.next("--password TEXT");
+    else if (opt == "--no-table") layout.noTable = true;
     else if (opt == "--row") {
         auto [plan, text] = planText("--row");
-        spec.rows.emplace_back(plan, Cell(encipher(text, kSecretKey)));
+        layout.rows.emplace_back(plan, Cell(encipher(text, kSecretKey)));
     } else if (opt == "--row-hex") {
         auto [plan, hex] = planText("--row-hex");
         const auto bytes = fromHex(hex);
         if (!bytes) die("--row-hex needs hex digits");
-        spec.rows.emplace_back(plan, Cell(encipher(*bytes, kSecretKey)));
+        layout.rows.emplace_back(plan, Cell(encipher(*bytes, kSecretKey)));
     } else if (opt == "--raw-row") {
         auto [plan, text] = planText("--raw-row");
-        spec.rows.emplace_back(plan, Cell(text));
+        layout.rows.emplace_back(plan, Cell(text));
     } else if (opt == "--null") {
-        spec.rows.emplace_back(planOf(args.next("--null PLAN")), Cell(Null{}));
+        layout.rows.emplace_back(planOf(args.next("--null PLAN")), Cell(Null{}));
     } else if (opt == "--columns") {
-        spec.columns.clear();
+        layout.columns.clear();
         std::stringstream list(args.next("--columns LIST"));
         for (std::string c; std::getline(list, c, ',');)
-            if (!c.empty()) spec.columns.push_back(c);
+            if (!c.empty()) layout.columns.push_back(c);
     } else {
         return false;
     }
     return true;
 }
 
-std::string buildDb(const DbSpec& spec) {
+std::string buildDb(const DbLayout& layout) {
     Database db;
-    db.password = spec.password;
-    if (!spec.noTable) {
+    db.password = layout.password;
+    if (!layout.noTable) {
         Table t;
         t.name = "PlanIDs";
-        t.columns = spec.columns;
-        for (const auto& [plan, settings] : spec.rows) {
+        t.columns = layout.columns;
+        for (const auto& [plan, settings] : layout.rows) {
             std::vector<Cell> row;
-            for (const auto& c : spec.columns) {
+            for (const auto& c : layout.columns) {
                 if (equalsNoCase(c, "Plan")) row.emplace_back(plan);
                 else if (equalsNoCase(c, "Settings")) row.push_back(settings);
                 else row.emplace_back(Null{});
@@ -266,12 +266,12 @@ int cmdExe(Args& args) {
 
 int cmdDb(Args& args) {
     const fs::path path = args.next("PATH");
-    DbSpec spec;
+    DbLayout layout;
     while (args.more()) {
         const std::string opt = args.next("option");
-        if (!dbOption(opt, args, spec)) die("unknown option " + opt);
+        if (!dbOption(opt, args, layout)) die("unknown option " + opt);
     }
-    writeFile(path, buildDb(spec));
+    writeFile(path, buildDb(layout));
     std::cout << path.string() << "\n";
     return 0;
 }
@@ -283,9 +283,9 @@ int cmdFolder(Args& args) {
     std::string version = "10.3.0.3";
     bool longServerPath = false;
     bool noVersion = false, noExe = false, flagNull = false, noCustRow = false, custNull = false, noDb = false;
-    DbSpec spec;
-    DbSpec extra; // rows given with the db options come after the ones made here
-    extra.password = spec.password;
+    DbLayout layout;
+    DbLayout extra; // rows given with the db options come after the ones made here
+    extra.password = layout.password;
     while (args.more()) {
         const std::string opt = args.next("option");
         if (opt == "--type") type = args.next("--type");
@@ -326,23 +326,23 @@ int cmdFolder(Args& args) {
     }
 
     // Rows the checker must pass over, around the ones it reads.
-    spec.password = extra.password;
-    spec.noTable = extra.noTable;
-    spec.columns = extra.columns;
-    spec.rows.emplace_back(1, Cell(encipher("STANDARD", kSecretKey)));
-    spec.rows.emplace_back(otherPlan, Cell(encipher("OTHER-PRODUCT-99", kSecretKey)));
-    if (flagNull) spec.rows.emplace_back(999, Cell(Null{}));
-    else if (custId) spec.rows.emplace_back(999, Cell(encipher("1", kSecretKey)));
+    layout.password = extra.password;
+    layout.noTable = extra.noTable;
+    layout.columns = extra.columns;
+    layout.rows.emplace_back(1, Cell(encipher("STANDARD", kSecretKey)));
+    layout.rows.emplace_back(otherPlan, Cell(encipher("OTHER-PRODUCT-99", kSecretKey)));
+    if (flagNull) layout.rows.emplace_back(999, Cell(Null{}));
+    else if (custId) layout.rows.emplace_back(999, Cell(encipher("1", kSecretKey)));
     if (!noCustRow) {
-        if (custNull) spec.rows.emplace_back(custPlan, Cell(Null{}));
-        else spec.rows.emplace_back(custPlan, Cell(encipher(custId.value_or("CUSTOMER-CODE"), kSecretKey)));
+        if (custNull) layout.rows.emplace_back(custPlan, Cell(Null{}));
+        else layout.rows.emplace_back(custPlan, Cell(encipher(custId.value_or("CUSTOMER-CODE"), kSecretKey)));
     }
-    spec.rows.insert(spec.rows.end(), extra.rows.begin(), extra.rows.end());
-    spec.rows.emplace_back(1000, Cell(encipher("LAST", kSecretKey)));
+    layout.rows.insert(layout.rows.end(), extra.rows.begin(), extra.rows.end());
+    layout.rows.emplace_back(1000, Cell(encipher("LAST", kSecretKey)));
 
     if (!noDb) {
         const fs::path dbDir = type == "client" ? fs::path(*server) / "data" : dir / "data";
-        writeFile(dbDir / (second ? "Odoz.Mdb" : "Ozp.ACCDB"), buildDb(spec));
+        writeFile(dbDir / (second ? "Odoz.Mdb" : "Ozp.ACCDB"), buildDb(layout));
     }
     std::cout << fs::absolute(dir).string() << "\n";
     return 0;
