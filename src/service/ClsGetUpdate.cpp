@@ -33,14 +33,20 @@ template <typename Body> std::string trapped(std::string_view source, Body&& bod
 std::string assemble(std::initializer_list<std::string_view> parts) {
     std::string out;
     std::size_t size = 0;
-    for (auto p : parts) size += p.size();
+    for (auto p : parts)
+        size += p.size();
     out.reserve(size);
-    for (auto p : parts) out.append(p);
+    for (auto p : parts)
+        out.append(p);
     return replaceAll(out, kBlank, kBlankOnWire);
 }
 
-std::string decimal(std::int32_t value) { return std::to_string(value); }
-std::string decimal(std::uint8_t value) { return std::to_string(static_cast<unsigned>(value)); }
+std::string decimal(std::int32_t value) {
+    return std::to_string(value);
+}
+std::string decimal(std::uint8_t value) {
+    return std::to_string(static_cast<unsigned>(value));
+}
 
 } // namespace
 
@@ -72,13 +78,10 @@ std::string ClsGetUpdate::fnInputStringCheckNewLicence(std::uint8_t bytProdID,
     });
 }
 
-std::string ClsGetUpdate::fnInputStringDownLoad(std::uint8_t bytProdID,
-                                                const std::string& strProdSubId,
-                                                const std::string& strMajorVersion,
-                                                const std::string& strMinorVersion,
-                                                const std::string& strCustCode,
-                                                const std::string& strRepoHead,
-                                                const std::string& strCDKey) {
+std::string ClsGetUpdate::fnInputStringDownLoad(
+    std::uint8_t bytProdID, const std::string& strProdSubId, const std::string& strMajorVersion,
+    const std::string& strMinorVersion, const std::string& strCustCode,
+    const std::string& strRepoHead, const std::string& strCDKey) {
     return trapped(kSrcInputStringDownLoad, [&] {
         return assemble({kKeySelect, decimal(bytProdID), kKeySetupType, strProdSubId,
                          kKeyReportHead, strRepoHead, kKeyCDKey, strCDKey, kKeyMajorVersion,
@@ -87,12 +90,9 @@ std::string ClsGetUpdate::fnInputStringDownLoad(std::uint8_t bytProdID,
     });
 }
 
-std::string ClsGetUpdate::fnInputStringDownLoadNewLicence(std::uint8_t vbytProdID,
-                                                          const std::string& vstrProdSubId,
-                                                          const std::string& vstrMajorVersion,
-                                                          const std::string& vstrMinorVersion,
-                                                          std::int32_t vlngCustID,
-                                                          const std::string& vstrRepoHead) {
+std::string ClsGetUpdate::fnInputStringDownLoadNewLicence(
+    std::uint8_t vbytProdID, const std::string& vstrProdSubId, const std::string& vstrMajorVersion,
+    const std::string& vstrMinorVersion, std::int32_t vlngCustID, const std::string& vstrRepoHead) {
     return trapped(kSrcInputStringDownLoadNewLicence, [&] {
         const std::string head = replaceAll(vstrRepoHead, kHeadAmpersand, kHeadAmpersandOnWire);
         return assemble({kKeySelect, decimal(vbytProdID), kKeySetupType, vstrProdSubId,
@@ -146,8 +146,7 @@ bool ClsGetUpdate::prValidateCheckInfo(const std::string& strInfo) {
 void ClsGetUpdate::prGetExeVersion(const std::string& strFile, std::string& strFileMajorVersion,
                                    std::string& strFileMinorVersion) {
     const std::string source(kSrcGetExeVersion);
-    if (!files_)
-        throw CheckerError(kErrObjectNotSet, source, std::string(kTextObjectNotSet));
+    if (!files_) throw CheckerError(kErrObjectNotSet, source, std::string(kTextObjectNotSet));
     const std::vector<std::string> parts =
         splitFields(files_->fileVersion(strFile), kVersionPartSeparator);
     if (parts.size() < 2) throw subscriptError(source);

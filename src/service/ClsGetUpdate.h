@@ -12,7 +12,7 @@
 namespace checker {
 
 class ClsGetUpdate {
-public:
+  public:
     // `baseAddress`: scheme and host of the update service, e.g. "http://127.0.0.1:8080".
     ClsGetUpdate(HttpPort& http, std::string baseAddress, FilesPort* files = nullptr);
 
@@ -31,8 +31,7 @@ public:
                                       const std::string& strMajorVersion,
                                       const std::string& strMinorVersion,
                                       const std::string& strCustCode,
-                                      const std::string& strRepoHead,
-                                      const std::string& strCDKey);
+                                      const std::string& strRepoHead, const std::string& strCDKey);
     std::string fnInputStringDownLoadNewLicence(std::uint8_t vbytProdID,
                                                 const std::string& vstrProdSubId,
                                                 const std::string& vstrMajorVersion,
@@ -57,7 +56,7 @@ public:
     const std::string& lastAddress() const { return strAddress_; }
     const std::string& lastAnswer() const { return strAnswer_; }
 
-private:
+  private:
     std::string call(std::string_view path, const std::string& strInputString,
                      std::string_view source);
 

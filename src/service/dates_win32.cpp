@@ -1,7 +1,8 @@
 #include "service/dates_win32.h"
 
 #include <windows.h>
-#include <oleauto.h>
+
+#include <oleauto.h> // after windows.h, which it needs
 
 #include <cstdio>
 
@@ -37,8 +38,8 @@ CalendarDate RegionalDatesPort::today() {
 std::string RegionalDatesPort::shortDateText(const CalendarDate& date) {
     const SYSTEMTIME st = toSystemTime(date);
     char buffer[80] = {};
-    const int n = ::GetDateFormatA(LOCALE_USER_DEFAULT, DATE_SHORTDATE, &st, nullptr, buffer,
-                                   sizeof buffer);
+    const int n =
+        ::GetDateFormatA(LOCALE_USER_DEFAULT, DATE_SHORTDATE, &st, nullptr, buffer, sizeof buffer);
     return n > 1 ? std::string(buffer, static_cast<std::size_t>(n - 1)) : std::string();
 }
 

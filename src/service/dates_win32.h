@@ -7,7 +7,7 @@
 namespace checker {
 
 class RegionalDatesPort final : public DatesPort {
-public:
+  public:
     CalendarDate today() override;
     std::string shortDateText(const CalendarDate& date) override;
     std::optional<CalendarDate> recognise(std::string_view text) override;

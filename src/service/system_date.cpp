@@ -36,11 +36,13 @@ std::string fnUpdateServerAddress() {
         std::free(value);
     }
 #else
-    if (const char* value = std::getenv(std::string(service::kServerEnvVar).c_str())) address = value;
+    if (const char* value = std::getenv(std::string(service::kServerEnvVar).c_str()))
+        address = value;
 #endif
     if (address.empty()) address = CHECKER_UPDATE_SERVER_DEFAULT;
     // The paths begin with "/": a trailing one here would double it.
-    while (!address.empty() && address.back() == '/') address.pop_back();
+    while (!address.empty() && address.back() == '/')
+        address.pop_back();
     return address;
 }
 

@@ -11,20 +11,28 @@ namespace checker {
 
 namespace {
 
-bool isSkipped(char c) { return c == ' ' || c == '\t' || c == '\n'; }
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
-char upper(char c) { return (c >= 'a' && c <= 'z') ? char(c - 'a' + 'A') : c; }
+bool isSkipped(char c) {
+    return c == ' ' || c == '\t' || c == '\n';
+}
+bool isDigit(char c) {
+    return c >= '0' && c <= '9';
+}
+char upper(char c) {
+    return (c >= 'a' && c <= 'z') ? char(c - 'a' + 'A') : c;
+}
 
 int digitValue(char c, int radix) {
     int v = -1;
-    if (isDigit(c)) v = c - '0';
-    else if (upper(c) >= 'A' && upper(c) <= 'F') v = upper(c) - 'A' + 10;
+    if (isDigit(c))
+        v = c - '0';
+    else if (upper(c) >= 'A' && upper(c) <= 'F')
+        v = upper(c) - 'A' + 10;
     return v < radix ? v : -1;
 }
 
 // Reads the text with the skipped characters taken out, so the number may be spread over blanks.
 class Cursor {
-public:
+  public:
     explicit Cursor(std::string_view text) : text_(text) { skip(); }
     bool done() const { return pos_ >= text_.size(); }
     char peek() const { return done() ? '\0' : text_[pos_]; }
@@ -32,18 +40,13 @@ public:
         ++pos_;
         skip();
     }
-    // Whether the character after the current one (blanks skipped) satisfies `test`.
-    template <typename Test> bool peekSecond(Test test) const {
-        std::size_t p = pos_ + 1;
-        while (p < text_.size() && isSkipped(text_[p])) ++p;
-        return p < text_.size() && test(text_[p]);
-    }
     std::size_t position() const { return pos_; }
     void restore(std::size_t p) { pos_ = p; }
 
-private:
+  private:
     void skip() {
-        while (pos_ < text_.size() && isSkipped(text_[pos_])) ++pos_;
+        while (pos_ < text_.size() && isSkipped(text_[pos_]))
+            ++pos_;
     }
     std::string_view text_;
     std::size_t pos_ = 0;
@@ -52,7 +55,8 @@ private:
 // "&H1F", "&O17": whole digits of the radix; no digit gives 0.
 double readRadix(Cursor& c, int radix) {
     double value = 0;
-    for (int d; (d = digitValue(c.peek(), radix)) >= 0; c.next()) value = value * radix + d;
+    for (int d; (d = digitValue(c.peek(), radix)) >= 0; c.next())
+        value = value * radix + d;
     return value;
 }
 
@@ -60,7 +64,7 @@ constexpr long long kExponentCap = 1'000'000'000'000LL;
 
 struct Decimal {
     double value = 0;
-    bool any = false; // at least one digit
+    bool any = false;     // at least one digit
     bool complete = true; // nothing left over after it
 };
 

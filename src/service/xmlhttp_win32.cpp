@@ -17,7 +17,7 @@ UniqueVariant synchronousFlag() {
 }
 
 class XmlHttpRequest final : public HttpRequest {
-public:
+  public:
     XmlHttpRequest(ComPtr<IDispatch> object, bool passCredentials)
         : object_(std::move(object)), passCredentials_(passCredentials) {}
 
@@ -48,7 +48,7 @@ public:
         return variantToText(*text.get(), std::string(kMemberResponseText));
     }
 
-private:
+  private:
     ComPtr<IDispatch> object_;
     bool passCredentials_;
 };

@@ -7,7 +7,7 @@
 namespace checker {
 
 class XmlHttpPort final : public HttpPort {
-public:
+  public:
     enum class Creation {
         // The service calls: the MSXML 3.0 XMLHTTP class by its class id; open() also passes an
         // empty user name and password.
@@ -20,7 +20,7 @@ public:
     // Throws CheckerError 429 when the object cannot be created.
     std::unique_ptr<HttpRequest> create() override;
 
-private:
+  private:
     Creation creation_;
 };
 

@@ -74,8 +74,8 @@ int main(int argc, char** argv) {
     // refuses (a second "?" in the query, say) never reaches routing; its 400 passes through the
     // error handler instead. The logger runs once at the end of every answer.
     static thread_local bool logged = false;
-    server.set_error_handler(httplib::Server::HandlerWithResponse(
-        [&](const httplib::Request& req, httplib::Response&) {
+    server.set_error_handler(
+        httplib::Server::HandlerWithResponse([&](const httplib::Request& req, httplib::Response&) {
             if (!logged) log.write(req.method, req.target);
             logged = true;
             return httplib::Server::HandlerResponse::Unhandled;

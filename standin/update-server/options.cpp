@@ -80,7 +80,8 @@ Options parseOptions(int argc, char** argv) {
             const auto eq = v.find('=');
             const std::string version = eq == std::string::npos ? "" : v.substr(eq + 1);
             if (eq == std::string::npos || eq == 0 || checker::splitFields(version, '.').size() < 2)
-                throw std::invalid_argument("--latest wants PRODUCT=VERSION with a dotted version: " + v);
+                throw std::invalid_argument(
+                    "--latest wants PRODUCT=VERSION with a dotted version: " + v);
             o.latest[v.substr(0, eq)] = version;
         } else if (arg == "--answer") {
             o.answer = value();
@@ -88,7 +89,8 @@ Options parseOptions(int argc, char** argv) {
             const std::string path = value();
             std::ifstream in(path, std::ios::binary);
             if (!in) throw std::invalid_argument("cannot read " + path);
-            o.answer = std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+            o.answer =
+                std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
         } else if (arg == "--date") {
             o.date = value();
         } else if (arg == "--status") {

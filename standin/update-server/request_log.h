@@ -9,7 +9,7 @@
 namespace updsrv {
 
 class RequestLog {
-public:
+  public:
     explicit RequestLog(const std::string& path) {
         if (!path.empty()) file_ = std::fopen(path.c_str(), "a");
     }
@@ -29,7 +29,7 @@ public:
         std::fflush(file_);
     }
 
-private:
+  private:
     std::FILE* file_ = nullptr;
     std::mutex mutex_;
 };

@@ -14,7 +14,9 @@ using namespace checker;
 
 namespace {
 
-CheckerError refused() { return CheckerError(-2146697208, "send", "Connection refused"); }
+CheckerError refused() {
+    return CheckerError(-2146697208, "send", "Connection refused");
+}
 
 template <typename Body> CheckerError caught(Body&& body) {
     try {
@@ -35,17 +37,22 @@ struct Calls : ::testing::Test {
 } // namespace
 
 TEST_F(Calls, EachOperationGetsItsOwnEndpointWithTheStringUnchanged) {
-    for (int i = 0; i < 4; ++i) http.replies.push_back({"answer" + std::to_string(i), {}});
+    for (int i = 0; i < 4; ++i)
+        http.replies.push_back({"answer" + std::to_string(i), {}});
     EXPECT_EQ(client.fnGetInfoCheckUpdate("a=1&b=+"), "answer0");
     EXPECT_EQ(client.fnGetInfoCheckUpdateNewLicence(""), "answer1");
     EXPECT_EQ(client.fnGetInfoDownload("x"), "answer2");
     EXPECT_EQ(client.fnGetInfoDownloadNewLicence("y"), "answer3");
     ASSERT_EQ(http.exchanges.size(), 4u);
-    EXPECT_EQ(http.exchanges[0].url, "http://127.0.0.1:8080/SUPPORT/Downloads/CheckWebUpdate.asp?a=1&b=+");
-    EXPECT_EQ(http.exchanges[1].url, "http://127.0.0.1:8080/SUPPORT/Downloads/CheckOZProUpdate.asp?");
+    EXPECT_EQ(http.exchanges[0].url,
+              "http://127.0.0.1:8080/SUPPORT/Downloads/CheckWebUpdate.asp?a=1&b=+");
+    EXPECT_EQ(http.exchanges[1].url,
+              "http://127.0.0.1:8080/SUPPORT/Downloads/CheckOZProUpdate.asp?");
     EXPECT_EQ(http.exchanges[2].url, "http://127.0.0.1:8080/Support/downloads/UpdateString.asp?x");
-    EXPECT_EQ(http.exchanges[3].url, "http://127.0.0.1:8080/Support/downloads/OZProUpdateString.asp?y");
-    for (const auto& x : http.exchanges) EXPECT_EQ(x.method, "GET");
+    EXPECT_EQ(http.exchanges[3].url,
+              "http://127.0.0.1:8080/Support/downloads/OZProUpdateString.asp?y");
+    for (const auto& x : http.exchanges)
+        EXPECT_EQ(x.method, "GET");
     EXPECT_EQ(client.lastAddress(), http.exchanges[3].url);
     EXPECT_EQ(client.lastAnswer(), "answer3");
 }
@@ -57,10 +64,18 @@ TEST_F(Calls, FailureCarriesTheLayersNumberAndTextWithTheOperationsName) {
         http.replies.push_back({"", refused()});
         const CheckerError e = caught([&] {
             switch (i) {
-            case 0: client.fnGetInfoCheckUpdate("q"); break;
-            case 1: client.fnGetInfoCheckUpdateNewLicence("q"); break;
-            case 2: client.fnGetInfoDownload("q"); break;
-            default: client.fnGetInfoDownloadNewLicence("q"); break;
+            case 0:
+                client.fnGetInfoCheckUpdate("q");
+                break;
+            case 1:
+                client.fnGetInfoCheckUpdateNewLicence("q");
+                break;
+            case 2:
+                client.fnGetInfoDownload("q");
+                break;
+            default:
+                client.fnGetInfoDownloadNewLicence("q");
+                break;
             }
         });
         EXPECT_EQ(e.number(), -2146697208);
@@ -101,10 +116,11 @@ TEST(ValidateCheckInfo, FieldThreeIsTheFlag) {
     EXPECT_TRUE(client.prValidateCheckInfo("a,10.4,b,tRUE,more,fields"));
     EXPECT_FALSE(client.prValidateCheckInfo(",,,false"));
 
-    for (const std::string& bad : std::vector<std::string>{"", "a,b,c", "no commas at all", std::string("\0\0\0", 3)})
+    for (const std::string& bad :
+         std::vector<std::string>{"", "a,b,c", "no commas at all", std::string("\0\0\0", 3)})
         EXPECT_EQ(caught([&] { client.prValidateCheckInfo(bad); }).number(), 9) << bad;
-    for (const std::string& bad : std::vector<std::string>{"a,b,c,", "a,b,c,yes", "a,b,c,True\r\n", "a,b,c,1x",
-                                  std::string("a,b,c,\0", 7)})
+    for (const std::string& bad : std::vector<std::string>{"a,b,c,", "a,b,c,yes", "a,b,c,True\r\n",
+                                                           "a,b,c,1x", std::string("a,b,c,\0", 7)})
         EXPECT_EQ(caught([&] { client.prValidateCheckInfo(bad); }).number(), 13) << bad;
 }
 
@@ -112,7 +128,8 @@ TEST(ValidateCheckInfo, LargeAndManyFieldAnswers) {
     fakes::FakeHttp http;
     ClsGetUpdate client(http, "");
     std::string many;
-    for (int i = 0; i < 1000; ++i) many += (i == 3 ? "1" : "\xe9x") + std::string(i < 999 ? "," : "");
+    for (int i = 0; i < 1000; ++i)
+        many += (i == 3 ? "1" : "\xe9x") + std::string(i < 999 ? "," : "");
     EXPECT_TRUE(client.prValidateCheckInfo(many));
     const std::string commas(1 << 20, ',');
     EXPECT_EQ(caught([&] { client.prValidateCheckInfo(commas); }).number(), 13);
@@ -123,8 +140,10 @@ TEST(ValidateCheckInfo, LargeAndManyFieldAnswers) {
 
 TEST_F(Calls, ExeVersionSplitsMajorAndLastPart) {
     files.plain = {"C:\\a.exe", "C:\\b.exe", "C:\\none.exe", "C:\\one.exe", "C:\\two.exe"};
-    files.versions = {{"C:\\a.exe", "10.3.0.3"}, {"C:\\b.exe", "9.0.0.12"},
-                      {"C:\\one.exe", "7"}, {"C:\\two.exe", "5.6"}};
+    files.versions = {{"C:\\a.exe", "10.3.0.3"},
+                      {"C:\\b.exe", "9.0.0.12"},
+                      {"C:\\one.exe", "7"},
+                      {"C:\\two.exe", "5.6"}};
     std::string major = "old", minor = "old";
     client.prGetExeVersion("C:\\a.exe", major, minor);
     EXPECT_EQ(major + "|" + minor, "10.3|3");
@@ -135,7 +154,8 @@ TEST_F(Calls, ExeVersionSplitsMajorAndLastPart) {
 
     for (const char* f : {"C:\\none.exe", "C:\\one.exe"})
         EXPECT_EQ(caught([&] { client.prGetExeVersion(f, major, minor); }).number(), 9);
-    EXPECT_EQ(caught([&] { client.prGetExeVersion("C:\\missing.exe", major, minor); }).number(), 53);
+    EXPECT_EQ(caught([&] { client.prGetExeVersion("C:\\missing.exe", major, minor); }).number(),
+              53);
     EXPECT_EQ(major + "|" + minor, "5.6|6"); // failures leave the texts alone
 }
 
@@ -152,8 +172,8 @@ TEST(SystemDate, DateAnswerIsRewrittenOtherAnswersPassUnchanged) {
     http.replies.push_back({"4.12.2026", {}});
     EXPECT_EQ(GetSystemDate(http, dates, ""), "12.04.2026");
 
-    for (const std::string& text : std::vector<std::string>{"", "<html><body>500</body></html>", "99/99/2026",
-                                   std::string("\0", 1)}) {
+    for (const std::string& text : std::vector<std::string>{"", "<html><body>500</body></html>",
+                                                            "99/99/2026", std::string("\0", 1)}) {
         http.replies.push_back({text, {}});
         EXPECT_EQ(GetSystemDate(http, dates, ""), text);
     }
@@ -175,8 +195,10 @@ void setServerVariable(const char* value) {
 #ifdef _WIN32
     _putenv_s("CHECKER_UPDATE_SERVER", value);
 #else
-    if (*value) setenv("CHECKER_UPDATE_SERVER", value, 1);
-    else unsetenv("CHECKER_UPDATE_SERVER");
+    if (*value)
+        setenv("CHECKER_UPDATE_SERVER", value, 1);
+    else
+        unsetenv("CHECKER_UPDATE_SERVER");
 #endif
 }
 } // namespace
@@ -184,7 +206,8 @@ void setServerVariable(const char* value) {
 TEST(UpdateServerAddress, EnvironmentWinsOverTheBuiltInDefault) {
     setServerVariable("");
     std::string fallback = CHECKER_UPDATE_SERVER_DEFAULT;
-    while (!fallback.empty() && fallback.back() == '/') fallback.pop_back();
+    while (!fallback.empty() && fallback.back() == '/')
+        fallback.pop_back();
     EXPECT_EQ(fnUpdateServerAddress(), fallback);
     setServerVariable("http://10.0.0.9:81");
     EXPECT_EQ(fnUpdateServerAddress(), "http://10.0.0.9:81");

@@ -69,7 +69,8 @@ TEST(TruthValue, WordsInAnyCaseOrNumbers) {
     EXPECT_EQ(fnTruthValue("&H0"), false);
     EXPECT_EQ(fnTruthValue("&HA"), true);
 
-    for (const std::string& bad : std::vector<std::string>{"", " ", " True", "False ", "Yes", "Truee", "1x", "1 2", "1.2.3", "&H", "+", ".",
-                                  "True\r\n", "1\t", std::string("1\0", 2)})
+    for (const std::string& bad :
+         std::vector<std::string>{"", " ", " True", "False ", "Yes", "Truee", "1x", "1 2", "1.2.3",
+                                  "&H", "+", ".", "True\r\n", "1\t", std::string("1\0", 2)})
         EXPECT_FALSE(fnTruthValue(bad).has_value()) << "[" << bad << "]";
 }

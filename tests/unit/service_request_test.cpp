@@ -69,13 +69,14 @@ TEST_F(Builders, NumbersInPlainDecimal) {
 
 TEST_F(Builders, EveryPrintableCharacterAndLongValuesComeThroughWhole) {
     std::string printable;
-    for (char c = ' '; c <= '~'; ++c) printable.push_back(c);
+    for (char c = ' '; c <= '~'; ++c)
+        printable.push_back(c);
     std::string expected = printable;
     expected[0] = '+';
-    const std::string check = client.fnInputStringCheck(1, "S", printable, printable, printable,
-                                                        printable);
-    EXPECT_EQ(check, "Select=1&txtCDKey=" + expected + "&MajorVersion=" + expected + "&CustCode=" +
-                         expected + "&ProdSubId=S&MinorVersion=" + expected);
+    const std::string check =
+        client.fnInputStringCheck(1, "S", printable, printable, printable, printable);
+    EXPECT_EQ(check, "Select=1&txtCDKey=" + expected + "&MajorVersion=" + expected +
+                         "&CustCode=" + expected + "&ProdSubId=S&MinorVersion=" + expected);
 
     // Control characters, NULs and non-ASCII bytes are copied as they are.
     const std::string odd("\x01\x00\xff\xe9 \x7f", 6);

@@ -56,12 +56,16 @@ void error(const CheckerError& e) {
     std::fflush(stdout);
 }
 
-std::uint8_t byteArg(const char* text) { return static_cast<std::uint8_t>(std::atoi(text)); }
-std::int32_t longArg(const char* text) { return static_cast<std::int32_t>(std::strtol(text, nullptr, 10)); }
+std::uint8_t byteArg(const char* text) {
+    return static_cast<std::uint8_t>(std::atoi(text));
+}
+std::int32_t longArg(const char* text) {
+    return static_cast<std::int32_t>(std::strtol(text, nullptr, 10));
+}
 
 // One call and what it left behind; the update flag for a check answer.
-void show(ClsGetUpdate& client, const std::string& request, std::string (ClsGetUpdate::*call)(const std::string&),
-          bool isCheck) {
+void show(ClsGetUpdate& client, const std::string& request,
+          std::string (ClsGetUpdate::*call)(const std::string&), bool isCheck) {
     line("REQUEST", request);
     try {
         const std::string answer = (client.*call)(request);
@@ -81,7 +85,8 @@ void show(ClsGetUpdate& client, const std::string& request, std::string (ClsGetU
 }
 
 int usage() {
-    std::fprintf(stderr, "usage: svcprobe check|checknew|download|downloadnew|raw|twice|date BASE ...\n");
+    std::fprintf(stderr,
+                 "usage: svcprobe check|checknew|download|downloadnew|raw|twice|date BASE ...\n");
     return 2;
 }
 
@@ -105,16 +110,19 @@ int main(int argc, char** argv) {
     try {
         if (command == "check" && argc >= 8) {
             const std::string cdKey = argc >= 9 ? argv[8] : "";
-            show(client, client.fnInputStringCheck(byteArg(argv[3]), argv[4], argv[5], argv[6], argv[7], cdKey),
+            show(client,
+                 client.fnInputStringCheck(byteArg(argv[3]), argv[4], argv[5], argv[6], argv[7],
+                                           cdKey),
                  &ClsGetUpdate::fnGetInfoCheckUpdate, true);
         } else if (command == "checknew" && argc >= 8) {
             show(client,
-                 client.fnInputStringCheckNewLicence(byteArg(argv[3]), argv[4], longArg(argv[5]), argv[6], argv[7]),
+                 client.fnInputStringCheckNewLicence(byteArg(argv[3]), argv[4], longArg(argv[5]),
+                                                     argv[6], argv[7]),
                  &ClsGetUpdate::fnGetInfoCheckUpdateNewLicence, true);
         } else if (command == "download" && argc >= 10) {
             show(client,
-                 client.fnInputStringDownLoad(byteArg(argv[3]), argv[4], argv[5], argv[6], argv[7], argv[8],
-                                              argv[9]),
+                 client.fnInputStringDownLoad(byteArg(argv[3]), argv[4], argv[5], argv[6], argv[7],
+                                              argv[8], argv[9]),
                  &ClsGetUpdate::fnGetInfoDownload, false);
         } else if (command == "downloadnew" && argc >= 9) {
             show(client,
@@ -124,11 +132,12 @@ int main(int argc, char** argv) {
         } else if (command == "raw" && argc >= 4) {
             show(client, argv[3], &ClsGetUpdate::fnGetInfoCheckUpdate, true);
         } else if (command == "twice" && argc >= 4) {
-            show(client, client.fnInputStringCheck(1, "S", "10.3", "3", "FIRST"), &ClsGetUpdate::fnGetInfoCheckUpdate,
-                 true);
+            show(client, client.fnInputStringCheck(1, "S", "10.3", "3", "FIRST"),
+                 &ClsGetUpdate::fnGetInfoCheckUpdate, true);
             std::printf("WAITING\n");
             std::fflush(stdout);
-            for (int i = 0; i < 600 && ::GetFileAttributesA(argv[3]) == INVALID_FILE_ATTRIBUTES; ++i)
+            for (int i = 0; i < 600 && ::GetFileAttributesA(argv[3]) == INVALID_FILE_ATTRIBUTES;
+                 ++i)
                 ::Sleep(100);
             show(client, client.fnInputStringCheckNewLicence(1, "S", 77, "10.3", "3"),
                  &ClsGetUpdate::fnGetInfoCheckUpdateNewLicence, true);
