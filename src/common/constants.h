@@ -363,6 +363,12 @@ inline constexpr std::uint32_t kImageRed = 0xFF0000;
 inline constexpr std::uint32_t kImageShadow = 0x808080;
 inline constexpr std::uint32_t kImageEdge = 0x800000;
 inline constexpr std::uint32_t kPictureOutline = 0x000000;
+// The flat button's face, in pixels at 96 dpi, and the edge of its raised style.
+inline constexpr int kButtonFocusInset = 2;
+inline constexpr int kButtonTextInset = 2;
+inline constexpr int kButtonPictureGap = 3;
+inline constexpr std::uint32_t kButtonEdgeLight = 0x808080;
+inline constexpr std::uint32_t kButtonEdgeDark = 0x404040;
 inline constexpr std::string_view kMessageFont = "Verdana";
 inline constexpr std::string_view kCaptionFont = "MS Sans Serif";
 inline constexpr std::string_view kButtonFont = "MS Sans Serif";
