@@ -9,11 +9,11 @@ namespace checker::msgbox {
 namespace {
 constexpr wchar_t kClassName[] = L"KtrButton";
 constexpr int kBaseDpi = common::kTwipsPerInch / common::kDefaultTwipsPerPixel;
-constexpr int kFocusInset = 2;   // the focus border, inside the edge
-constexpr int kTextInset = 2;    // caption and picture keep clear of the edge
-constexpr int kPictureGap = 3;   // between picture and caption, in pixels at 96 dpi
-constexpr std::uint32_t kEdgeLight = 0x808080;
-constexpr std::uint32_t kEdgeDark = 0x404040;
+constexpr int kFocusInset = kButtonFocusInset;
+constexpr int kTextInset = kButtonTextInset;
+constexpr int kPictureGap = kButtonPictureGap;
+constexpr std::uint32_t kEdgeLight = kButtonEdgeLight;
+constexpr std::uint32_t kEdgeDark = kButtonEdgeDark;
 
 int scaled(int px96, int dpi) { return ::MulDiv(px96, dpi, kBaseDpi); }
 } // namespace

@@ -72,7 +72,7 @@ mb_key() { # key names for xdotool, pressed one after the other
 
 # Waits for the demo to end: MB_RC exit code, MB_RESULT the printed result (or "none").
 mb_answer() {
-    local deadline=$(($(date +%s) + 15))
+    local deadline=$(($(date +%s) + 30))
     while kill -0 "$MB_PID" 2>/dev/null; do
         if [ "$(date +%s)" -ge "$deadline" ]; then
             # Close the box the way the system would, so that it cannot cover the next one.
