@@ -2,6 +2,7 @@
 
 #include <shellapi.h>
 
+#include <algorithm>
 #include <cstring>
 
 #include "common/constants.h"
@@ -67,7 +68,8 @@ void frmCheckUpdate::prShowPopupMenu() {
 }
 
 LRESULT CALLBACK fnTrayWindowProc(HWND hWnd, UINT uMsg, WPARAM wParam, LPARAM lParam) {
-    if (uMsg == tray::kTrayCallbackMessage && lParam == WM_RBUTTONUP && blnTrayIconAdded) {
+    if (uMsg == tray::kTrayCallbackMessage && lParam == static_cast<LPARAM>(WM_RBUTTONUP) &&
+        blnTrayIconAdded) {
         auto* form = reinterpret_cast<frmCheckUpdate*>(::GetWindowLongPtrA(hWnd, GWLP_USERDATA));
         if (form) guarded([&] { form->prShowPopupMenu(); });
     } else if (uMsg == uTaskbarCreated && uTaskbarCreated != 0 && blnTrayIconAdded) {

@@ -9,7 +9,17 @@ BASE=http://127.0.0.1:$(svc_free_port)
 tray_folder
 tray_start
 e2e_wait_window 30 --class CheckOZProUpdateMain >/dev/null || fail "main window never loaded"
-sleep 110
+sleep 3
+# A shell restart loses the icon; the "TaskbarCreated" broadcast brings it back.
+hwnd=$(tray_hwnd)
+check "icon in Wine's tray window" [ -n "$(tray_tray_window)" ]
+e2e_wine "$WINBIN/traypoke.exe" delete "$hwnd"
+sleep 2
+check "icon lost with the shell (the tray window hides)" [ -z "$(tray_tray_window)" ]
+e2e_wine "$WINBIN/traypoke.exe" created "$hwnd"
+sleep 2
+check "icon added again on TaskbarCreated" [ -n "$(tray_tray_window)" ]
+sleep 100
 check "server unreachable at the fifteenth tick: still running" e2e_running
 check "no message box" [ -z "$(e2e_msgbox_text)" ]
 check "nothing shown" [ "$(e2e_field "$(tray_main)" visible)" = 0 ]
