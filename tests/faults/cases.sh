@@ -93,7 +93,7 @@ patch_case() { # name, expected, must, forbidden, UpdateInfo.INI body, [patch fi
     fault_folder --type client --server "$SCEN/server" --cust-id X-10042 --version 10.3.0.3
     fault_server --latest 1=10.4.0.5 --answer 'a,10.4.0.5,b,False'
     printf "[VERSIONINFO]\r\n%b" "$body" >"$SCEN/server/UpdateInfo.INI"
-    [ -n "$place" ] && cp "$WINBIN/PatchProgram.exe" "$SCEN/server/$place"
+    [ -n "$place" ] && cp "$WINBIN/OZProPatch.exe" "$SCEN/server/$place"
     fault_start
     fault_wait_check 10
     local o
@@ -111,8 +111,8 @@ case_patch_in_use() {
     fault_folder --type client --server "$SCEN/server" --cust-id X-10042 --version 10.3.0.3
     fault_server --latest 1=10.4.0.5
     printf '[VERSIONINFO]\r\nBaseVersMajor=10.3\r\nBaseVersMinor=3\r\nVersMajorAvai=10.3\r\nVersMinorAvai=5\r\nPatcFileName=Patch.exe\r\n' >"$SCEN/server/UpdateInfo.INI"
-    cp "$WINBIN/PatchProgram.exe" "$SCEN/server/Patch.exe"
-    cp "$WINBIN/PatchProgram.exe" "$APP/Patch.exe"
+    cp "$WINBIN/OZProPatch.exe" "$SCEN/server/Patch.exe"
+    cp "$WINBIN/OZProPatch.exe" "$APP/Patch.exe"
     (cd "$APP" && exec wine "$WINBIN/lockfile.exe" "$(winpath "$APP/Patch.exe")") >/dev/null 2>&1 &
     E2E_PIDS+=($!); sleep 3
     fault_start; e2e_wait_exit 20
