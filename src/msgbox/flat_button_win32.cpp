@@ -15,7 +15,9 @@ constexpr int kPictureGap = kButtonPictureGap;
 constexpr std::uint32_t kEdgeLight = kButtonEdgeLight;
 constexpr std::uint32_t kEdgeDark = kButtonEdgeDark;
 
-int scaled(int px96, int dpi) { return ::MulDiv(px96, dpi, kBaseDpi); }
+int scaled(int px96, int dpi) {
+    return ::MulDiv(px96, dpi, kBaseDpi);
+}
 } // namespace
 
 KtrButton::~KtrButton() {
@@ -55,20 +57,25 @@ void KtrButton::setCaption(const std::string& caption) {
 }
 
 void KtrButton::setPosition(int xPx, int yPx) {
-    if (hwnd_) ::SetWindowPos(hwnd_, nullptr, xPx, yPx, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
+    if (hwnd_)
+        ::SetWindowPos(hwnd_, nullptr, xPx, yPx, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
 }
 
 void KtrButton::setVisible(bool visible) {
     if (hwnd_) ::ShowWindow(hwnd_, visible ? SW_SHOWNA : SW_HIDE);
 }
 
-bool KtrButton::visible() const { return hwnd_ && (::GetWindowLongPtrW(hwnd_, GWL_STYLE) & WS_VISIBLE); }
+bool KtrButton::visible() const {
+    return hwnd_ && (::GetWindowLongPtrW(hwnd_, GWL_STYLE) & WS_VISIBLE);
+}
 
 void KtrButton::setFocus() {
     if (hwnd_) ::SetFocus(hwnd_);
 }
 
-bool KtrButton::hasFocus() const { return hwnd_ && ::GetFocus() == hwnd_; }
+bool KtrButton::hasFocus() const {
+    return hwnd_ && ::GetFocus() == hwnd_;
+}
 
 void KtrButton::setPicturePosition(std::int32_t value) {
     picturePosition_ = value;
@@ -77,7 +84,8 @@ void KtrButton::setPicturePosition(std::int32_t value) {
 
 LRESULT CALLBACK KtrButton::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NCCREATE) {
-        auto* self = static_cast<KtrButton*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
+        auto* self =
+            static_cast<KtrButton*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
         self->hwnd_ = hwnd;
         ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
     }
@@ -202,7 +210,8 @@ void KtrButton::paint(HDC dc) {
     }
 
     const std::wstring text = toWide(caption_);
-    SelectScope useFont(dc, font_ ? static_cast<HGDIOBJ>(font_) : ::GetStockObject(DEFAULT_GUI_FONT));
+    SelectScope useFont(dc,
+                        font_ ? static_cast<HGDIOBJ>(font_) : ::GetStockObject(DEFAULT_GUI_FONT));
     ::SetBkMode(dc, TRANSPARENT);
     ::SetTextColor(dc, fore);
     const UINT format = DT_SINGLELINE | DT_VCENTER | DT_END_ELLIPSIS;

@@ -29,7 +29,7 @@ struct KtrButtonDesign {
 };
 
 class KtrButton {
-public:
+  public:
     KtrButton() = default;
     KtrButton(const KtrButton&) = delete;
     KtrButton& operator=(const KtrButton&) = delete;
@@ -54,7 +54,7 @@ public:
     void setPicturePosition(std::int32_t value);
     std::int32_t picturePosition() const noexcept { return picturePosition_; }
 
-private:
+  private:
     static LRESULT CALLBACK StaticWndProc(HWND, UINT, WPARAM, LPARAM);
     LRESULT WndProc(UINT message, WPARAM wParam, LPARAM lParam);
     void paint(HDC dc);

@@ -15,11 +15,10 @@ std::int32_t fnShowMsgBox(const std::string& strMessage, std::int32_t lngStyle,
 
 // The message may be any value: numbers are shown as their text.
 template <typename T>
-    requires std::is_arithmetic_v<T>
-std::int32_t fnShowMsgBox(T message, std::int32_t lngStyle, const std::string& strTitle,
-                          bool blnCentre, const std::string& strCaption1,
-                          const std::string& strCaption2, const std::string& strCaption3,
-                          bool blnAlwaysOnTop) {
+requires std::is_arithmetic_v<T> std::int32_t
+fnShowMsgBox(T message, std::int32_t lngStyle, const std::string& strTitle, bool blnCentre,
+             const std::string& strCaption1, const std::string& strCaption2,
+             const std::string& strCaption3, bool blnAlwaysOnTop) {
     return fnShowMsgBox(std::to_string(message), lngStyle, strTitle, blnCentre, strCaption1,
                         strCaption2, strCaption3, blnAlwaysOnTop);
 }

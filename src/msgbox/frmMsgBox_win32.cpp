@@ -42,19 +42,28 @@ frmMsgBox::~frmMsgBox() {
     if (hwnd_) ::DestroyWindow(hwnd_);
 }
 
-int frmMsgBox::xPx(int twips) const { return twipsToPixels(twips, twipsX_); }
-int frmMsgBox::yPx(int twips) const { return twipsToPixels(twips, twipsY_); }
+int frmMsgBox::xPx(int twips) const {
+    return twipsToPixels(twips, twipsX_);
+}
+int frmMsgBox::yPx(int twips) const {
+    return twipsToPixels(twips, twipsY_);
+}
 RECT frmMsgBox::rectPx(int left, int top, int width, int height) const {
     return RECT{xPx(left), yPx(top), xPx(left + width), yPx(top + height)};
 }
 
 KtrButton* frmMsgBox::buttonOf(Button button) {
     switch (button) {
-    case Button::OK: return &cmdOK;
-    case Button::No: return &cmdNo;
-    case Button::Cancel: return &cmdCancel;
-    case Button::Close: return &cmdClose;
-    default: return nullptr;
+    case Button::OK:
+        return &cmdOK;
+    case Button::No:
+        return &cmdNo;
+    case Button::Cancel:
+        return &cmdCancel;
+    case Button::Close:
+        return &cmdClose;
+    default:
+        return nullptr;
     }
 }
 
@@ -81,7 +90,8 @@ void frmMsgBox::Load() {
         wc.hInstance = instance_;
         wc.hCursor = ::LoadCursorA(nullptr, IDC_ARROW);
         wc.lpszClassName = kClassName;
-        if (!::RegisterClassExW(&wc)) throw CheckerError(0, "frmMsgBox", "Cannot register the window");
+        if (!::RegisterClassExW(&wc))
+            throw CheckerError(0, "frmMsgBox", "Cannot register the window");
     }
     // No system frame or title bar: the black strip is the title.
     ::CreateWindowExW(0, kClassName, toWide(kWindowCaption).c_str(), WS_POPUP | WS_CLIPCHILDREN,
@@ -111,8 +121,9 @@ void frmMsgBox::Load() {
     KtrButtonDesign cancel = answer;
     cancel.picture = Picture::Prohibition;
     cancel.picturePx = kCancelPicturePx;
-    cmdCancel.Create(hwnd_, idCmdCancel, rectPx(kSlot3Left, kButtonTop, kButtonWidth, kButtonHeight),
-                     cancel, buttonFont, dpiY_);
+    cmdCancel.Create(hwnd_, idCmdCancel,
+                     rectPx(kSlot3Left, kButtonTop, kButtonWidth, kButtonHeight), cancel,
+                     buttonFont, dpiY_);
     cmdCancel.setCaption(model_.cmdCancel.caption);
 
     KtrButtonDesign no = answer;
@@ -227,7 +238,8 @@ void frmMsgBox::Form_Activate() {
     if (model_.AlwaysOnTop) prSetTopMost(hwnd_);
     // Growth with the fitted text, but never so far that the answers leave the screen.
     const int screenHeight = pixelsToTwips(::GetSystemMetrics(SM_CYSCREEN), twipsY_);
-    const int fitted = capMessageHeight(model_.messageHeight, screenHeight, model_.CentreinMDIClient);
+    const int fitted =
+        capMessageHeight(model_.messageHeight, screenHeight, model_.CentreinMDIClient);
     activateLayout(model_, fitted);
     prSyncLayout();
     buttonOf(focusTarget(model_))->setFocus();
@@ -265,10 +277,14 @@ void frmMsgBox::ShowModal() {
 
 void frmMsgBox::prClick(Button button) {
     if (button == Button::None) return;
-    if (button == Button::OK) cmdOK_Click();
-    else if (button == Button::No) cmdNo_Click();
-    else if (button == Button::Cancel) cmdCancel_Click();
-    else cmdClose_Click();
+    if (button == Button::OK)
+        cmdOK_Click();
+    else if (button == Button::No)
+        cmdNo_Click();
+    else if (button == Button::Cancel)
+        cmdCancel_Click();
+    else
+        cmdClose_Click();
 }
 
 void frmMsgBox::prAnswer(Button button) {
@@ -276,12 +292,22 @@ void frmMsgBox::prAnswer(Button button) {
     ::ShowWindow(hwnd_, SW_HIDE);
 }
 
-void frmMsgBox::cmdOK_Click() { prAnswer(Button::OK); }
-void frmMsgBox::cmdNo_Click() { prAnswer(Button::No); }
-void frmMsgBox::cmdCancel_Click() { prAnswer(Button::Cancel); }
-void frmMsgBox::cmdClose_Click() { prAnswer(Button::Close); }
+void frmMsgBox::cmdOK_Click() {
+    prAnswer(Button::OK);
+}
+void frmMsgBox::cmdNo_Click() {
+    prAnswer(Button::No);
+}
+void frmMsgBox::cmdCancel_Click() {
+    prAnswer(Button::Cancel);
+}
+void frmMsgBox::cmdClose_Click() {
+    prAnswer(Button::Close);
+}
 
-void frmMsgBox::Form_KeyDown(int keyCode) { prClick(keyTarget(model_, keyCode)); }
+void frmMsgBox::Form_KeyDown(int keyCode) {
+    prClick(keyTarget(model_, keyCode));
+}
 
 void frmMsgBox::Frame1_MouseDown() {
     ::ReleaseCapture();
@@ -317,7 +343,8 @@ void frmMsgBox::prPaint(HDC dc) {
 
 LRESULT CALLBACK frmMsgBox::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NCCREATE) {
-        auto* self = static_cast<frmMsgBox*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
+        auto* self =
+            static_cast<frmMsgBox*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
         self->hwnd_ = hwnd;
         ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
     }
@@ -345,16 +372,26 @@ LRESULT frmMsgBox::WndProc(UINT message, WPARAM wParam, LPARAM lParam) {
     case WM_COMMAND:
         if (HIWORD(wParam) == BN_CLICKED) {
             switch (LOWORD(wParam)) {
-            case idCmdOK: cmdOK_Click(); break;
-            case idCmdNo: cmdNo_Click(); break;
-            case idCmdCancel: cmdCancel_Click(); break;
-            case idCmdClose: cmdClose_Click(); break;
-            default: break;
+            case idCmdOK:
+                cmdOK_Click();
+                break;
+            case idCmdNo:
+                cmdNo_Click();
+                break;
+            case idCmdCancel:
+                cmdCancel_Click();
+                break;
+            case idCmdClose:
+                cmdClose_Click();
+                break;
+            default:
+                break;
             }
         }
         return 0;
     case kPreviewKey: {
-        // The form sees every key first; Tab moves along the tab order; Alt+letter is an access key.
+        // The form sees every key first; Tab moves along the tab order; Alt+letter is an access
+        // key.
         const int key = static_cast<int>(wParam);
         if (key == VK_TAB) {
             prTabFocus(::GetFocus(), (::GetKeyState(VK_SHIFT) & 0x8000) == 0);

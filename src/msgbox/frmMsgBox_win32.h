@@ -17,10 +17,17 @@
 namespace checker::msgbox {
 
 class frmMsgBox {
-public:
+  public:
     // Control ids (what wininfo reports for the children).
     enum ControlId : int {
-        idFrame1 = 1, idLblCaption, idCmdClose, idImage1, idLblMsg, idCmdOK, idCmdNo, idCmdCancel
+        idFrame1 = 1,
+        idLblCaption,
+        idCmdClose,
+        idImage1,
+        idLblMsg,
+        idCmdOK,
+        idCmdNo,
+        idCmdCancel
     };
 
     explicit frmMsgBox(HINSTANCE instance);
@@ -38,11 +45,11 @@ public:
     void AlwaysOnTop(bool value) noexcept { model_.AlwaysOnTop = value; }
 
     // ---- what fnShowMsgBox does with the controls; the first of them loads the window
-    void setTitle(const std::string& title);                  // lblCaption
+    void setTitle(const std::string& title); // lblCaption
     bool applyStyle(std::int32_t style, const std::string& caption1, const std::string& caption2,
-                    const std::string& caption3);             // captions, slots, btnNo, btnCancel
+                    const std::string& caption3); // captions, slots, btnNo, btnCancel
     void applyCaptionPictures(const std::string& caption1, const std::string& caption2,
-                              const std::string& caption3);   // the buttons' numeric property
+                              const std::string& caption3); // the buttons' numeric property
     // Shows the window modally and returns once it is hidden (or gone).
     void ShowModal();
 
@@ -51,11 +58,11 @@ public:
     HWND hwnd() const noexcept { return hwnd_; }
     const MsgBoxModel& model() const noexcept { return model_; }
 
-private:
+  private:
     static LRESULT CALLBACK StaticWndProc(HWND, UINT, WPARAM, LPARAM);
     LRESULT WndProc(UINT message, WPARAM wParam, LPARAM lParam);
 
-    void Load();      // creates the window and its controls at their design, then Form_Load
+    void Load(); // creates the window and its controls at their design, then Form_Load
     void Form_Load();
     void Form_Activate();
     void Form_KeyDown(int keyCode);

@@ -11,8 +11,8 @@ MsgBoxModel::MsgBoxModel()
     : title(kDesignTitle), messageText(kDesignMessage), messageHeight(kMsgHeight),
       windowWidth(kWindowWidth), windowHeight(kWindowHeight), shapeWidth(kWindowWidth),
       shapeHeight(kWindowHeight), cmdOK{std::string(kCaptionYes), kSlot1Left, kButtonTop},
-      cmdNo{std::string(kCaptionNo), kSlot2Left, kButtonTop},
-      cmdCancel{std::string(kCaptionCancel), kSlot3Left, kButtonTop} {}
+      cmdNo{std::string(kCaptionNo), kSlot2Left, kButtonTop}, cmdCancel{std::string(kCaptionCancel),
+                                                                        kSlot3Left, kButtonTop} {}
 
 void setReturnValue(MsgBoxModel& box, std::int32_t value) {
     if (value < 0 || value > 255) throw overflowError("frmMsgBox");
@@ -112,7 +112,9 @@ void activateLayout(MsgBoxModel& box, int fittedMessageHeight) {
     }
 }
 
-Button focusTarget(const MsgBoxModel& box) { return box.cmdNo.visible ? Button::No : Button::OK; }
+Button focusTarget(const MsgBoxModel& box) {
+    return box.cmdNo.visible ? Button::No : Button::OK;
+}
 
 std::int32_t clickResult(const MsgBoxModel& box, Button button) {
     switch (button) {

@@ -9,11 +9,12 @@ namespace checker::msgbox {
 
 std::wstring toWide(std::string_view utf8) {
     if (utf8.empty()) return {};
-    const int n = ::MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()),
-                                        nullptr, 0);
+    const int n =
+        ::MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()), nullptr, 0);
     std::wstring out(static_cast<std::size_t>(std::max(n, 0)), L'\0');
     if (n > 0)
-        ::MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()), out.data(), n);
+        ::MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()), out.data(),
+                              n);
     return out;
 }
 
@@ -23,8 +24,8 @@ std::string toUtf8(std::wstring_view wide) {
                                         nullptr, 0, nullptr, nullptr);
     std::string out(static_cast<std::size_t>(std::max(n, 0)), '\0');
     if (n > 0)
-        ::WideCharToMultiByte(CP_UTF8, 0, wide.data(), static_cast<int>(wide.size()), out.data(),
-                              n, nullptr, nullptr);
+        ::WideCharToMultiByte(CP_UTF8, 0, wide.data(), static_cast<int>(wide.size()), out.data(), n,
+                              nullptr, nullptr);
     return out;
 }
 
@@ -82,20 +83,25 @@ void ring(HDC dc, const RECT& r, COLORREF c, int width) {
     ::Ellipse(dc, r.left, r.top, r.right, r.bottom);
 }
 
-void filledShape(HDC dc, const std::vector<POINT>& points, COLORREF fill, COLORREF edge, bool round) {
+void filledShape(HDC dc, const std::vector<POINT>& points, COLORREF fill, COLORREF edge,
+                 bool round) {
     UniqueGdiObject brush(::CreateSolidBrush(fill));
     UniqueGdiObject pen(::CreatePen(PS_SOLID, 1, edge));
     SelectScope useBrush(dc, brush.get());
     SelectScope usePen(dc, pen.get());
-    if (round) ::Ellipse(dc, points[0].x, points[0].y, points[1].x, points[1].y);
-    else ::Polygon(dc, points.data(), static_cast<int>(points.size()));
+    if (round)
+        ::Ellipse(dc, points[0].x, points[0].y, points[1].x, points[1].y);
+    else
+        ::Polygon(dc, points.data(), static_cast<int>(points.size()));
 }
 
 // Every stroke outlined in black first, then all of them in colour on top: the pictures read on
 // black and grey faces alike.
 void outlined(HDC dc, const std::vector<std::vector<POINT>>& strokes, int unit) {
-    for (const auto& s : strokes) polyline(dc, s, colour(kPictureOutline), unit + 2);
-    for (const auto& s : strokes) polyline(dc, s, colour(kPictureYellow), unit);
+    for (const auto& s : strokes)
+        polyline(dc, s, colour(kPictureOutline), unit + 2);
+    for (const auto& s : strokes)
+        polyline(dc, s, colour(kPictureYellow), unit);
 }
 
 void exclamation(HDC dc, const RECT& box, int dx, int dy, COLORREF fill, COLORREF edge) {
@@ -118,11 +124,13 @@ void drawPicture(HDC dc, Picture picture, const RECT& box) {
         outlined(dc, {{at(box, g, 3, 8), at(box, g, 6, 12), at(box, g, 13, 3)}}, unit);
         break;
     case Picture::Cross:
-        outlined(dc, {{at(box, g, 4, 4), at(box, g, 12, 12)}, {at(box, g, 12, 4), at(box, g, 4, 12)}},
+        outlined(dc,
+                 {{at(box, g, 4, 4), at(box, g, 12, 12)}, {at(box, g, 12, 4), at(box, g, 4, 12)}},
                  unit);
         break;
     case Picture::Prohibition: {
-        const RECT r{at(box, g, 2, 2).x, at(box, g, 2, 2).y, at(box, g, 14, 14).x, at(box, g, 14, 14).y};
+        const RECT r{at(box, g, 2, 2).x, at(box, g, 2, 2).y, at(box, g, 14, 14).x,
+                     at(box, g, 14, 14).y};
         ring(dc, r, colour(kPictureOutline), unit + 2);
         outlined(dc, {{at(box, g, 4, 12), at(box, g, 12, 4)}}, unit);
         ring(dc, r, colour(kPictureYellow), unit);

@@ -50,7 +50,8 @@ SIZE MsgBoxPart::fittedSize() const {
     HDC dc = ::GetDC(hwnd_);
     SIZE size{0, 0};
     {
-        SelectScope useFont(dc, font_ ? static_cast<HGDIOBJ>(font_) : ::GetStockObject(DEFAULT_GUI_FONT));
+        SelectScope useFont(dc, font_ ? static_cast<HGDIOBJ>(font_)
+                                      : ::GetStockObject(DEFAULT_GUI_FONT));
         const std::wstring text = toWide(text_);
         // An empty text still takes one line.
         const std::wstring measured = text.empty() ? std::wstring(L" ") : text;
@@ -71,7 +72,8 @@ void MsgBoxPart::move(int xPx, int yPx, int widthPx, int heightPx) {
 
 LRESULT CALLBACK MsgBoxPart::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NCCREATE) {
-        auto* self = static_cast<MsgBoxPart*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
+        auto* self =
+            static_cast<MsgBoxPart*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
         self->hwnd_ = hwnd;
         ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
     }

@@ -13,7 +13,7 @@
 namespace checker::msgbox {
 
 class MsgBoxPart {
-public:
+  public:
     enum class Kind { Panel, Label, Image };
 
     MsgBoxPart() = default;
@@ -43,7 +43,7 @@ public:
     // Panels: any mouse button pressed on the panel itself.
     std::function<void()> onMouseDown;
 
-private:
+  private:
     static LRESULT CALLBACK StaticWndProc(HWND, UINT, WPARAM, LPARAM);
     LRESULT WndProc(UINT message, WPARAM wParam, LPARAM lParam);
     UINT textFormat() const;

@@ -26,7 +26,9 @@ struct Shown {
     int left;
     std::string_view caption;
 };
-Shown of(const ButtonModel& b) { return {b.visible, b.left, b.caption}; }
+Shown of(const ButtonModel& b) {
+    return {b.visible, b.left, b.caption};
+}
 bool operator==(const Shown& a, const Shown& b) {
     return a.visible == b.visible && (!a.visible || (a.left == b.left && a.caption == b.caption));
 }
@@ -157,7 +159,8 @@ TEST(MsgBoxLayout, OneLineShrinksByThirtyAndEveryLineGrowsWindowButtonsAndBorder
     EXPECT_EQ(one.windowHeight, 1320);
     EXPECT_EQ(one.shapeHeight, 1320);
     EXPECT_EQ(one.shapeWidth, kWindowWidth);
-    for (const auto* b : {&one.cmdOK, &one.cmdNo, &one.cmdCancel}) EXPECT_EQ(b->top, 780);
+    for (const auto* b : {&one.cmdOK, &one.cmdNo, &one.cmdCancel})
+        EXPECT_EQ(b->top, 780);
 
     const auto three = shown(3, "", "", "", false, 3 * kMsgHeight);
     EXPECT_EQ(three.windowHeight, 1320 + 2 * kMsgHeight);
@@ -184,7 +187,8 @@ TEST(MsgBoxLayout, AVeryLongMessageIsCutSoTheButtonsStayOnTheScreen) {
     EXPECT_EQ(capMessageHeight(585, screen, true), 585);
     // Not centred: the window's bottom (5000 + height) stays on the screen.
     const int capped = capMessageHeight(100000, screen, false);
-    EXPECT_EQ(shown(0, "", "", "", false, capped).windowTop + shown(0, "", "", "", false, capped).windowHeight,
+    EXPECT_EQ(shown(0, "", "", "", false, capped).windowTop +
+                  shown(0, "", "", "", false, capped).windowHeight,
               screen);
     // Centred: neither the top nor the bottom leaves the screen.
     const auto centred = shown(0, "", "", "", true, capMessageHeight(100000, screen, true));
