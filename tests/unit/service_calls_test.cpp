@@ -6,9 +6,11 @@
 #include <vector>
 
 #include "common/constants.h"
+#include "common/text.h"
 #include "fakes.h"
 #include "service/ClsGetUpdate.h"
 #include "service/system_date.h"
+#include "service/version_number.h"
 
 using namespace checker;
 
@@ -214,4 +216,32 @@ TEST(UpdateServerAddress, EnvironmentWinsOverTheBuiltInDefault) {
     setServerVariable("http://10.0.0.9:81//");
     EXPECT_EQ(fnUpdateServerAddress(), "http://10.0.0.9:81");
     setServerVariable("");
+}
+
+// Random answers built from the characters that matter to the readers: the outcome follows
+// from the field count and field 3 alone, and nothing else escapes.
+TEST(ValidateCheckInfo, RandomAnswersGiveTheFlagOrErrorsNineAndThirteen) {
+    fakes::FakeHttp http;
+    ClsGetUpdate client(http, "");
+    const std::string alphabet = std::string(",,,01-+.eE&HhTRUEtrue \t\n\xe9", 26) + '\0';
+    std::uint32_t seed = 12345;
+    auto next = [&] { return seed = seed * 1103515245u + 12345u, (seed >> 16) & 0x7fff; };
+    for (int i = 0; i < 3000; ++i) {
+        std::string answer;
+        const std::size_t length = next() % 40;
+        for (std::size_t k = 0; k < length; ++k)
+            answer.push_back(alphabet[next() % alphabet.size()]);
+        const std::vector<std::string> fields = splitFields(answer, ',');
+        try {
+            const bool flag = client.prValidateCheckInfo(answer);
+            ASSERT_GE(fields.size(), 4u) << answer;
+            ASSERT_EQ(fnTruthValue(fields[3]), flag) << answer;
+        } catch (const CheckerError& e) {
+            if (fields.size() < 4)
+                ASSERT_EQ(e.number(), 9) << answer;
+            else
+                ASSERT_EQ(e.number(), 13) << answer;
+            ASSERT_EQ(e.source(), "prValidateCheckInfo");
+        }
+    }
 }
