@@ -47,6 +47,10 @@ for op in "check $BASE 1 S 10.3 3 K|fnGetInfoCheckUpdate" "checknew $BASE 1 S 1 
     check "refused connection: ${op#*|} fails with its own name" grep -qE "^ERROR -?[0-9]+\|${op#*|}\|" <<<"$out"
 done
 check "refused connection: no answer stored" grep -qxF "LASTANSWER []" <<<"$out"
+# Wine's HTTP layer reports a refused connection as 0x800C0008 (Windows: 0x800C0005 or similar).
+out=$(svc_probe checknew "$BASE" 1 S 1 10.3 3)
+check "refused connection: the HTTP layer's own number is passed on" \
+    grep -qE "^ERROR (-2146697208|-2146697211)\|fnGetInfoCheckUpdateNewLicence\|.+" <<<"$out"
 
 svc_start --drop
 out=$(svc_probe checknew "$BASE" 1 S 1 10.3 3)
