@@ -3,13 +3,13 @@
 // automation calls, so a failure carries the number and text of the layer that raised it.
 #include <windows.h>
 
+#include <memory>
+#include <optional>
 #include <string>
 
 #include "common/com_win32.h"
 #include "common/constants.h"
 #include "common/files_win32.h"
-#include "common/text.h"
-#include "startup/customer_id.h"
 #include "startup/host_database.h"
 #include "tray/frmCheckUpdate_win32.h"
 
@@ -46,32 +46,6 @@ bool boolOf(const UniqueVariant& value, const std::string& source) {
     return converted.get()->boolVal != VARIANT_FALSE;
 }
 
-// The Settings are stored enciphered. Their plain form comes from the host's own protection
-// component, the one that also yields the database password: created for this one text,
-// given the key, asked to decipher, released. A null value cannot be passed as text (error 94).
-std::string fnPlainSettings(const UniqueVariant& stored, const std::string& storedText) {
-    if (stored.isNull()) throw CheckerError(94, std::string(c::kColumnSettings), "Invalid use of Null");
-    ComPtr<IDispatch> protect = createByProgId(c::kProgIdProtect);
-    putProperty(protect.Get(), c::kMemberSecretKey, UniqueVariant(c::kSecretKey));
-    std::vector<UniqueVariant> args;
-    args.emplace_back(storedText);
-    const UniqueVariant plain = invokeMethod(protect.Get(), c::kMemberDecryptURL, std::move(args));
-    return variantToText(*plain.get(), std::string(c::kMemberDecryptURL));
-}
-
-// Recordset.Open(source, objConn, adOpenStatic, adLockReadOnly) with unspecified options.
-ComPtr<IDispatch> prOpenPlanIDs(std::string_view sql) {
-    ComPtr<IDispatch> rs = createByProgId(c::kProgIdRecordset);
-    std::vector<UniqueVariant> args;
-    args.emplace_back(sql);
-    args.push_back(dispatchArg(objConn.Get()));
-    args.emplace_back(static_cast<long>(c::kAdOpenStatic));
-    args.emplace_back(static_cast<long>(c::kAdLockReadOnly));
-    args.push_back(UniqueVariant::missing());
-    invokeMethod(rs.Get(), c::kMemberOpen, std::move(args));
-    return rs;
-}
-
 // rs.Fields(index).Value, where index is a column name or an ordinal.
 UniqueVariant fieldValue(IDispatch* rs, UniqueVariant index) {
     const UniqueVariant fields = getProperty(rs, c::kMemberFields);
@@ -83,9 +57,71 @@ UniqueVariant fieldValue(IDispatch* rs, UniqueVariant index) {
     return getProperty(fieldObject.Get(), c::kMemberValue);
 }
 
-void setFilter(IDispatch* rs, UniqueVariant filter) { putProperty(rs, c::kMemberFilter, std::move(filter)); }
+std::optional<std::string> textOrNull(const UniqueVariant& value) {
+    if (value.isNull()) return std::nullopt;
+    return variantToText(*value.get(), std::string(c::kColumnSettings));
+}
 
-bool atEnd(IDispatch* rs) { return boolOf(getProperty(rs, c::kMemberEOF), std::string(c::kMemberEOF)); }
+// An ADODB.Recordset opened on objConn: static cursor, read-only locking, options unspecified.
+class AdoPlanRecordset final : public PlanRecordset {
+public:
+    explicit AdoPlanRecordset(std::string_view sql) : rs_(createByProgId(c::kProgIdRecordset)) {
+        std::vector<UniqueVariant> args;
+        args.emplace_back(sql);
+        args.push_back(dispatchArg(objConn.Get()));
+        args.emplace_back(static_cast<long>(c::kAdOpenStatic));
+        args.emplace_back(static_cast<long>(c::kAdLockReadOnly));
+        args.push_back(UniqueVariant::missing());
+        invokeMethod(rs_.Get(), c::kMemberOpen, std::move(args));
+    }
+    void clearFilter() override {
+        putProperty(rs_.Get(), c::kMemberFilter, UniqueVariant(static_cast<long>(c::kAdFilterNone)));
+    }
+    void filter(const std::string& criteria) override {
+        putProperty(rs_.Get(), c::kMemberFilter, UniqueVariant(criteria));
+    }
+    bool eof() override { return boolOf(getProperty(rs_.Get(), c::kMemberEOF), std::string(c::kMemberEOF)); }
+    std::optional<std::string> field(std::string_view column) override {
+        return textOrNull(fieldValue(rs_.Get(), UniqueVariant(column)));
+    }
+    std::optional<std::string> firstField() override {
+        return textOrNull(fieldValue(rs_.Get(), UniqueVariant(static_cast<long>(c::kFirstColumn))));
+    }
+    void findFirst(const std::string& criteria) override {
+        std::vector<UniqueVariant> args;
+        args.emplace_back(criteria);
+        args.emplace_back(0L);
+        args.emplace_back(static_cast<long>(c::kAdSearchForward));
+        args.emplace_back(static_cast<long>(c::kAdBookmarkFirst));
+        invokeMethod(rs_.Get(), c::kMemberFind, std::move(args));
+    }
+    bool isOpen() override {
+        return longOf(getProperty(rs_.Get(), c::kMemberState), std::string(c::kMemberState)) ==
+               c::kAdStateOpen;
+    }
+    void close() override { invokeMethod(rs_.Get(), c::kMemberClose); }
+
+private:
+    ComPtr<IDispatch> rs_; // released with this object
+};
+
+class AdoHostDatabase final : public HostDatabasePort {
+public:
+    std::unique_ptr<PlanRecordset> open(std::string_view sql) override {
+        return std::make_unique<AdoPlanRecordset>(sql);
+    }
+    // The Settings are stored enciphered. Their plain form comes from the host's own protection
+    // component, the one that also yields the database password: created for this one text,
+    // given the key, asked to decipher, released.
+    std::string plainSettings(const std::string& stored) override {
+        ComPtr<IDispatch> protect = createByProgId(c::kProgIdProtect);
+        putProperty(protect.Get(), c::kMemberSecretKey, UniqueVariant(c::kSecretKey));
+        std::vector<UniqueVariant> args;
+        args.emplace_back(stored);
+        const UniqueVariant plain = invokeMethod(protect.Get(), c::kMemberDecryptURL, std::move(args));
+        return variantToText(*plain.get(), std::string(c::kMemberDecryptURL));
+    }
+};
 
 } // namespace
 
@@ -119,45 +155,15 @@ void frmCheckUpdate::prOpenDatabase() {
 }
 
 void frmCheckUpdate::prReadSettings() {
-    ComPtr<IDispatch> rsPlanIDs = prOpenPlanIDs(c::kSqlSettings);
-    setFilter(rsPlanIDs.Get(), UniqueVariant(static_cast<long>(c::kAdFilterNone)));
-    setFilter(rsPlanIDs.Get(), UniqueVariant(fnPlanFilter(c::kPlanCustomerIdFlag)));
-    if (!atEnd(rsPlanIDs.Get()) &&
-        !fieldValue(rsPlanIDs.Get(), UniqueVariant(c::kColumnSettings)).isNull()) {
-        record.blnUseCustID = true;
-        setFilter(rsPlanIDs.Get(), UniqueVariant(static_cast<long>(c::kAdFilterNone)));
-        setFilter(rsPlanIDs.Get(), UniqueVariant(fnPlanFilter(profile.bytCustPlan)));
-        const UniqueVariant stored = fieldValue(rsPlanIDs.Get(), UniqueVariant(c::kColumnSettings));
-        const std::string storedText = stored.isNull() ? std::string()
-                                                       : variantToText(*stored.get(), std::string(c::kColumnSettings));
-        record.lngCustID = fnDeriveCustID(fnPlainSettings(stored, storedText));
-    }
-    invokeMethod(rsPlanIDs.Get(), c::kMemberClose);
-    rsPlanIDs.Reset();
+    AdoHostDatabase db;
+    fnReadSettings(db, profile.bytCustPlan, record);
 }
 
 void frmCheckUpdate::prGetVersion() {
     Win32FilesPort files;
-    const std::string version = files.fileVersion(hostExePath(profile.lngInstallType, strFolder));
+    AdoHostDatabase db;
     // No version: the end of the program, at once and silently (the tray icon stays as it is).
-    if (!fnApplyInstalledVersion(version, record)) ::ExitProcess(0);
-
-    ComPtr<IDispatch> rsPlanIDs = prOpenPlanIDs(c::kSqlCustomerRow);
-    std::vector<UniqueVariant> findArgs;
-    findArgs.emplace_back(fnPlanFind(profile.bytCustPlan));
-    findArgs.emplace_back(0L);
-    findArgs.emplace_back(static_cast<long>(c::kAdSearchForward));
-    findArgs.emplace_back(static_cast<long>(c::kAdBookmarkFirst));
-    invokeMethod(rsPlanIDs.Get(), c::kMemberFind, std::move(findArgs));
-    const UniqueVariant stored =
-        fieldValue(rsPlanIDs.Get(), UniqueVariant(static_cast<long>(c::kFirstColumn)));
-    const std::string storedText =
-        stored.isNull() ? std::string() : trimBlanks(variantToText(*stored.get(), std::string(c::kColumnSettings)));
-    record.strCustCode = fnPlainSettings(stored, storedText);
-    if (longOf(getProperty(rsPlanIDs.Get(), c::kMemberState), std::string(c::kMemberState)) ==
-        c::kAdStateOpen)
-        invokeMethod(rsPlanIDs.Get(), c::kMemberClose);
-    rsPlanIDs.Reset();
+    if (!fnGetVersion(files, db, profile, strFolder, record)) ::ExitProcess(0);
 }
 
 void frmCheckUpdate::prCloseDatabase() {
