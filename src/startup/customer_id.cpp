@@ -1,8 +1,8 @@
 #include "startup/customer_id.h"
 
-#include <cstdlib>
 #include <algorithm>
 #include <cmath>
+#include <cstdlib>
 #include <limits>
 #include <string>
 
@@ -14,7 +14,9 @@ namespace checker {
 namespace {
 constexpr const char* kSource = "lngCustID";
 
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
+bool isDigit(char c) {
+    return c >= '0' && c <= '9';
+}
 } // namespace
 
 std::optional<double> fnPlatformNumber(std::string_view text) {
@@ -30,17 +32,20 @@ std::optional<double> fnPlatformNumber(std::string_view text) {
     }
     // Check the shape ourselves: the parser below would accept "inf", "nan" and hex forms.
     std::size_t i = 0, digits = 0;
-    while (i < body.size() && isDigit(body[i])) ++i, ++digits;
+    while (i < body.size() && isDigit(body[i]))
+        ++i, ++digits;
     if (i < body.size() && body[i] == '.') {
         ++i;
-        while (i < body.size() && isDigit(body[i])) ++i, ++digits;
+        while (i < body.size() && isDigit(body[i]))
+            ++i, ++digits;
     }
     if (digits == 0) return std::nullopt;
     if (i < body.size() && (body[i] == 'e' || body[i] == 'E')) {
         ++i;
         if (i < body.size() && (body[i] == '+' || body[i] == '-')) ++i;
         std::size_t expDigits = 0;
-        while (i < body.size() && isDigit(body[i])) ++i, ++expDigits;
+        while (i < body.size() && isDigit(body[i]))
+            ++i, ++expDigits;
         if (expDigits == 0) return std::nullopt;
     }
     if (i != body.size()) return std::nullopt;

@@ -23,9 +23,13 @@ std::string fnConnectionString(std::string_view databasePath, std::string_view p
     return out;
 }
 
-std::string fnPlanFilter(int plan) { return std::string(c::kFilterPrefix) + std::to_string(plan); }
+std::string fnPlanFilter(int plan) {
+    return std::string(c::kFilterPrefix) + std::to_string(plan);
+}
 
-std::string fnPlanFind(int plan) { return std::string(c::kFindPrefix) + std::to_string(plan); }
+std::string fnPlanFind(int plan) {
+    return std::string(c::kFindPrefix) + std::to_string(plan);
+}
 
 bool fnApplyInstalledVersion(std::string_view fileVersion, CustomerRecord& record) {
     if (fileVersion.empty()) return false;
@@ -60,7 +64,8 @@ void fnReadSettings(HostDatabasePort& db, std::uint8_t bytCustPlan, CustomerReco
 
 bool fnGetVersion(FilesPort& files, HostDatabasePort& db, const HostProfile& profile,
                   std::string_view checkerFolder, CustomerRecord& record) {
-    const std::string version = files.fileVersion(hostExePath(profile.lngInstallType, checkerFolder));
+    const std::string version =
+        files.fileVersion(hostExePath(profile.lngInstallType, checkerFolder));
     if (!fnApplyInstalledVersion(version, record)) return false;
 
     const std::unique_ptr<PlanRecordset> rsPlanIDs = db.open(c::kSqlCustomerRow);

@@ -32,7 +32,7 @@ bool fnApplyInstalledVersion(std::string_view fileVersion, CustomerRecord& recor
 // One read of PlanIDs on the open connection (a static, read-only recordset), as the two reads
 // use it. Failures throw CheckerError with the database layer's number and text.
 class PlanRecordset {
-public:
+  public:
     virtual ~PlanRecordset() = default;
     virtual void clearFilter() = 0;
     virtual void filter(const std::string& criteria) = 0;
@@ -49,7 +49,7 @@ public:
 // The host database as start-up reads it: recordsets on the connection of prOpenDatabase, and
 // the plain form of a stored Settings text.
 class HostDatabasePort {
-public:
+  public:
     virtual ~HostDatabasePort() = default;
     virtual std::unique_ptr<PlanRecordset> open(std::string_view sql) = 0;
     virtual std::string plainSettings(const std::string& stored) = 0;

@@ -40,8 +40,7 @@ std::int32_t longOf(const UniqueVariant& value, const std::string& source) {
 
 bool boolOf(const UniqueVariant& value, const std::string& source) {
     UniqueVariant converted;
-    if (FAILED(
-            ::VariantChangeType(converted.put(), const_cast<VARIANT*>(value.get()), 0, VT_BOOL)))
+    if (FAILED(::VariantChangeType(converted.put(), const_cast<VARIANT*>(value.get()), 0, VT_BOOL)))
         throw typeMismatchError(source);
     return converted.get()->boolVal != VARIANT_FALSE;
 }
@@ -49,11 +48,13 @@ bool boolOf(const UniqueVariant& value, const std::string& source) {
 // rs.Fields(index).Value, where index is a column name or an ordinal.
 UniqueVariant fieldValue(IDispatch* rs, UniqueVariant index) {
     const UniqueVariant fields = getProperty(rs, c::kMemberFields);
-    const ComPtr<IDispatch> fieldsObject = variantToDispatch(*fields.get(), std::string(c::kMemberFields));
+    const ComPtr<IDispatch> fieldsObject =
+        variantToDispatch(*fields.get(), std::string(c::kMemberFields));
     std::vector<UniqueVariant> args;
     args.push_back(std::move(index));
     const UniqueVariant field = invokeMethod(fieldsObject.Get(), c::kMemberItem, std::move(args));
-    const ComPtr<IDispatch> fieldObject = variantToDispatch(*field.get(), std::string(c::kMemberItem));
+    const ComPtr<IDispatch> fieldObject =
+        variantToDispatch(*field.get(), std::string(c::kMemberItem));
     return getProperty(fieldObject.Get(), c::kMemberValue);
 }
 
@@ -64,7 +65,7 @@ std::optional<std::string> textOrNull(const UniqueVariant& value) {
 
 // An ADODB.Recordset opened on objConn: static cursor, read-only locking, options unspecified.
 class AdoPlanRecordset final : public PlanRecordset {
-public:
+  public:
     explicit AdoPlanRecordset(std::string_view sql) : rs_(createByProgId(c::kProgIdRecordset)) {
         std::vector<UniqueVariant> args;
         args.emplace_back(sql);
@@ -75,12 +76,15 @@ public:
         invokeMethod(rs_.Get(), c::kMemberOpen, std::move(args));
     }
     void clearFilter() override {
-        putProperty(rs_.Get(), c::kMemberFilter, UniqueVariant(static_cast<long>(c::kAdFilterNone)));
+        putProperty(rs_.Get(), c::kMemberFilter,
+                    UniqueVariant(static_cast<long>(c::kAdFilterNone)));
     }
     void filter(const std::string& criteria) override {
         putProperty(rs_.Get(), c::kMemberFilter, UniqueVariant(criteria));
     }
-    bool eof() override { return boolOf(getProperty(rs_.Get(), c::kMemberEOF), std::string(c::kMemberEOF)); }
+    bool eof() override {
+        return boolOf(getProperty(rs_.Get(), c::kMemberEOF), std::string(c::kMemberEOF));
+    }
     std::optional<std::string> field(std::string_view column) override {
         return textOrNull(fieldValue(rs_.Get(), UniqueVariant(column)));
     }
@@ -101,12 +105,12 @@ public:
     }
     void close() override { invokeMethod(rs_.Get(), c::kMemberClose); }
 
-private:
+  private:
     ComPtr<IDispatch> rs_; // released with this object
 };
 
 class AdoHostDatabase final : public HostDatabasePort {
-public:
+  public:
     std::unique_ptr<PlanRecordset> open(std::string_view sql) override {
         return std::make_unique<AdoPlanRecordset>(sql);
     }
@@ -118,7 +122,8 @@ public:
         putProperty(protect.Get(), c::kMemberSecretKey, UniqueVariant(c::kSecretKey));
         std::vector<UniqueVariant> args;
         args.emplace_back(stored);
-        const UniqueVariant plain = invokeMethod(protect.Get(), c::kMemberDecryptURL, std::move(args));
+        const UniqueVariant plain =
+            invokeMethod(protect.Get(), c::kMemberDecryptURL, std::move(args));
         return variantToText(*plain.get(), std::string(c::kMemberDecryptURL));
     }
 };

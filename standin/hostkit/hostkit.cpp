@@ -96,7 +96,8 @@ std::string readFile(const fs::path& p) {
 void writeFile(const fs::path& p, const std::string& data) {
     if (p.has_parent_path()) fs::create_directories(p.parent_path());
     std::ofstream out(p, std::ios::binary | std::ios::trunc);
-    if (!out || !out.write(data.data(), static_cast<std::streamsize>(data.size()))) die("cannot write " + p.string());
+    if (!out || !out.write(data.data(), static_cast<std::streamsize>(data.size())))
+        die("cannot write " + p.string());
 }
 
 fs::path stubsDir(const std::optional<std::string>& given) {
@@ -115,8 +116,10 @@ std::pair<std::uint32_t, std::uint32_t> parseVersion(const std::string& text) {
     std::size_t count = 0, start = 0;
     for (;;) {
         const auto dot = text.find('.', start);
-        const std::string s = text.substr(start, dot == std::string::npos ? std::string::npos : dot - start);
-        if (s.empty() || s.size() > 5 || s.find_first_not_of("0123456789") != std::string::npos || count == 4)
+        const std::string s =
+            text.substr(start, dot == std::string::npos ? std::string::npos : dot - start);
+        if (s.empty() || s.size() > 5 || s.find_first_not_of("0123456789") != std::string::npos ||
+            count == 4)
             die("bad version: " + text);
         const unsigned long v = std::stoul(s);
         if (v > 0xFFFF) die("bad version: " + text);
@@ -128,10 +131,12 @@ std::pair<std::uint32_t, std::uint32_t> parseVersion(const std::string& text) {
 }
 
 void putLe32(std::string& data, std::size_t at, std::uint32_t v) {
-    for (int i = 0; i < 4; ++i) data[at + i] = static_cast<char>((v >> (8 * i)) & 0xFF);
+    for (int i = 0; i < 4; ++i)
+        data[at + i] = static_cast<char>((v >> (8 * i)) & 0xFF);
 }
 
-void makeExe(const fs::path& path, const std::optional<std::string>& version, const fs::path& stubs) {
+void makeExe(const fs::path& path, const std::optional<std::string>& version,
+             const fs::path& stubs) {
     if (!version) {
         writeFile(path, readFile(stubs / "hoststub.exe"));
         return;
@@ -176,8 +181,10 @@ bool dbOption(const std::string& opt, Args& args, DbLayout& layout) {
         if (eq == std::string::npos) die(what + " needs PLAN=TEXT");
         return std::make_pair(planOf(v.substr(0, eq)), v.substr(eq + 1));
     };
-    if (opt == "--password") layout.password = args.next("--password TEXT");
-    else if (opt == "--no-table") layout.noTable = true;
+    if (opt == "--password")
+        layout.password = args.next("--password TEXT");
+    else if (opt == "--no-table")
+        layout.noTable = true;
     else if (opt == "--row") {
         auto [plan, text] = planText("--row");
         layout.rows.emplace_back(plan, Cell(encipher(text, kSecretKey)));
@@ -212,9 +219,12 @@ std::string buildDb(const DbLayout& layout) {
         for (const auto& [plan, settings] : layout.rows) {
             std::vector<Cell> row;
             for (const auto& c : layout.columns) {
-                if (equalsNoCase(c, "Plan")) row.emplace_back(plan);
-                else if (equalsNoCase(c, "Settings")) row.push_back(settings);
-                else row.emplace_back(Null{});
+                if (equalsNoCase(c, "Plan"))
+                    row.emplace_back(plan);
+                else if (equalsNoCase(c, "Settings"))
+                    row.push_back(settings);
+                else
+                    row.emplace_back(Null{});
             }
             t.rows.push_back(std::move(row));
         }
@@ -240,7 +250,8 @@ std::string shortLink(const fs::path& target) {
     const fs::path links = env ? fs::path(env) : fs::path("/tmp/hostkit-links");
     fs::create_directories(links);
     std::uint32_t h = 2166136261u; // FNV-1a of the path: one stable link per server folder
-    for (char c : absolute.string()) h = (h ^ static_cast<unsigned char>(c)) * 16777619u;
+    for (char c : absolute.string())
+        h = (h ^ static_cast<unsigned char>(c)) * 16777619u;
     char name[16];
     std::snprintf(name, sizeof name, "%08x", h);
     const fs::path link = links / name;
@@ -255,9 +266,12 @@ int cmdExe(Args& args) {
     std::optional<std::string> version, stubs;
     while (args.more()) {
         const std::string opt = args.next("option");
-        if (opt == "--version") version = args.next("--version A.B.C.D");
-        else if (opt == "--stubs") stubs = args.next("--stubs DIR");
-        else die("unknown option " + opt);
+        if (opt == "--version")
+            version = args.next("--version A.B.C.D");
+        else if (opt == "--stubs")
+            stubs = args.next("--stubs DIR");
+        else
+            die("unknown option " + opt);
     }
     makeExe(path, version, stubsDir(stubs));
     std::cout << path.string() << "\n";
@@ -282,26 +296,41 @@ int cmdFolder(Args& args) {
     std::optional<std::string> server, custId, application, stubs;
     std::string version = "10.3.0.3";
     bool longServerPath = false;
-    bool noVersion = false, noExe = false, flagNull = false, noCustRow = false, custNull = false, noDb = false;
+    bool noVersion = false, noExe = false, flagNull = false, noCustRow = false, custNull = false,
+         noDb = false;
     DbLayout layout;
     DbLayout extra; // rows given with the db options come after the ones made here
     extra.password = layout.password;
     while (args.more()) {
         const std::string opt = args.next("option");
-        if (opt == "--type") type = args.next("--type");
-        else if (opt == "--server") server = args.next("--server SERVERDIR");
-        else if (opt == "--version") version = args.next("--version A.B.C.D");
-        else if (opt == "--no-version") noVersion = true;
-        else if (opt == "--no-exe") noExe = true;
-        else if (opt == "--cust-id") custId = args.next("--cust-id TEXT");
-        else if (opt == "--flag-null") flagNull = true;
-        else if (opt == "--no-cust-row") noCustRow = true;
-        else if (opt == "--cust-null") custNull = true;
-        else if (opt == "--application") application = args.next("--application TEXT");
-        else if (opt == "--no-db") noDb = true;
-        else if (opt == "--long-server-path") longServerPath = true;
-        else if (opt == "--stubs") stubs = args.next("--stubs DIR");
-        else if (!dbOption(opt, args, extra)) die("unknown option " + opt);
+        if (opt == "--type")
+            type = args.next("--type");
+        else if (opt == "--server")
+            server = args.next("--server SERVERDIR");
+        else if (opt == "--version")
+            version = args.next("--version A.B.C.D");
+        else if (opt == "--no-version")
+            noVersion = true;
+        else if (opt == "--no-exe")
+            noExe = true;
+        else if (opt == "--cust-id")
+            custId = args.next("--cust-id TEXT");
+        else if (opt == "--flag-null")
+            flagNull = true;
+        else if (opt == "--no-cust-row")
+            noCustRow = true;
+        else if (opt == "--cust-null")
+            custNull = true;
+        else if (opt == "--application")
+            application = args.next("--application TEXT");
+        else if (opt == "--no-db")
+            noDb = true;
+        else if (opt == "--long-server-path")
+            longServerPath = true;
+        else if (opt == "--stubs")
+            stubs = args.next("--stubs DIR");
+        else if (!dbOption(opt, args, extra))
+            die("unknown option " + opt);
     }
     if (type != "standalone" && type != "client" && type != "second")
         die("--type must be standalone, client or second");
@@ -312,16 +341,19 @@ int cmdFolder(Args& args) {
     const std::int32_t custPlan = second ? 89 : 14;
     const std::int32_t otherPlan = second ? 14 : 89;
     if (!noExe) {
-        const std::optional<std::string> v = noVersion ? std::nullopt : std::optional<std::string>(version);
+        const std::optional<std::string> v =
+            noVersion ? std::nullopt : std::optional<std::string>(version);
         makeExe(dir / (second ? "OrvelDo.exe" : "OZPLICNew.exe"), v, stubsDir(stubs));
     }
     if (type == "standalone") writeFile(dir / "data" / "OZPBLANK.ACCDB", "");
     if (second) writeFile(dir / "data" / "ODOZBLANK.MDB", "");
-    if (application) writeFile(dir / "Application.INI", "[General]\r\nApplication=" + *application + "\r\n");
+    if (application)
+        writeFile(dir / "Application.INI", "[General]\r\nApplication=" + *application + "\r\n");
     if (type == "client") {
         fs::create_directories(*server);
         std::string serverPath = windowsPath(*server) + "\\";
-        if (serverPath.size() > kLongestServerPath && !longServerPath) serverPath = shortLink(*server) + "\\";
+        if (serverPath.size() > kLongestServerPath && !longServerPath)
+            serverPath = shortLink(*server) + "\\";
         writeFile(dir / "CLIENT.INI", "[General]\r\nServerPath=" + serverPath + "\r\n");
     }
 
@@ -331,11 +363,16 @@ int cmdFolder(Args& args) {
     layout.columns = extra.columns;
     layout.rows.emplace_back(1, Cell(encipher("STANDARD", kSecretKey)));
     layout.rows.emplace_back(otherPlan, Cell(encipher("OTHER-PRODUCT-99", kSecretKey)));
-    if (flagNull) layout.rows.emplace_back(999, Cell(Null{}));
-    else if (custId) layout.rows.emplace_back(999, Cell(encipher("1", kSecretKey)));
+    if (flagNull)
+        layout.rows.emplace_back(999, Cell(Null{}));
+    else if (custId)
+        layout.rows.emplace_back(999, Cell(encipher("1", kSecretKey)));
     if (!noCustRow) {
-        if (custNull) layout.rows.emplace_back(custPlan, Cell(Null{}));
-        else layout.rows.emplace_back(custPlan, Cell(encipher(custId.value_or("CUSTOMER-CODE"), kSecretKey)));
+        if (custNull)
+            layout.rows.emplace_back(custPlan, Cell(Null{}));
+        else
+            layout.rows.emplace_back(custPlan,
+                                     Cell(encipher(custId.value_or("CUSTOMER-CODE"), kSecretKey)));
     }
     layout.rows.insert(layout.rows.end(), extra.rows.begin(), extra.rows.end());
     layout.rows.emplace_back(1000, Cell(encipher("LAST", kSecretKey)));
@@ -352,7 +389,8 @@ int cmdFolder(Args& args) {
 
 int main(int argc, char** argv) {
     Args args;
-    for (int i = 1; i < argc; ++i) args.items.emplace_back(argv[i]);
+    for (int i = 1; i < argc; ++i)
+        args.items.emplace_back(argv[i]);
     if (!args.more() || args.items[0] == "--help" || args.items[0] == "-h") {
         std::cout << kHelp;
         return args.more() ? 0 : 2;

@@ -18,25 +18,31 @@ constexpr char kAdoFields[] = "ADODB.Fields";
 constexpr char kAdoField[] = "ADODB.Field";
 
 ComFailure closedError(const char* source) {
-    return {static_cast<HRESULT>(0x800A0E78), "Operation is not allowed when the object is closed.", source};
+    return {static_cast<HRESULT>(0x800A0E78), "Operation is not allowed when the object is closed.",
+            source};
 }
 ComFailure openError(const char* source) {
-    return {static_cast<HRESULT>(0x800A0E79), "Operation is not allowed when the object is open.", source};
+    return {static_cast<HRESULT>(0x800A0E79), "Operation is not allowed when the object is open.",
+            source};
 }
 ComFailure argumentsError(const char* source) {
     return {static_cast<HRESULT>(0x800A0BB9),
-            "Arguments are of the wrong type, are out of acceptable range, or are in conflict with one another.",
+            "Arguments are of the wrong type, are out of acceptable range, or are in conflict with "
+            "one another.",
             source};
 }
 ComFailure itemNotFound(const char* source) {
-    return {static_cast<HRESULT>(0x800A0CC1),
-            "Item cannot be found in the collection corresponding to the requested name or ordinal.", source};
+    return {
+        static_cast<HRESULT>(0x800A0CC1),
+        "Item cannot be found in the collection corresponding to the requested name or ordinal.",
+        source};
 }
 ComFailure noCurrentRecord(const char* source) {
-    return {static_cast<HRESULT>(0x800A0BCD),
-            "Either BOF or EOF is True, or the current record has been deleted. Requested operation "
-            "requires a current record.",
-            source};
+    return {
+        static_cast<HRESULT>(0x800A0BCD),
+        "Either BOF or EOF is True, or the current record has been deleted. Requested operation "
+        "requires a current record.",
+        source};
 }
 
 constexpr std::string_view kProvider = "Microsoft.ACE.OLEDB.12.0";
@@ -49,17 +55,19 @@ constexpr long kSearchBackward = -1;
 enum ConnectionMember : DISPID { cState = 1, cOpen, cClose, cConnectionString };
 
 class Connection final : public DispatchObject {
-public:
+  public:
     Connection()
         : DispatchObject("Connection",
-                         {{L"State", Kind::Property}, {L"Open", Kind::Method}, {L"Close", Kind::Method},
+                         {{L"State", Kind::Property},
+                          {L"Open", Kind::Method},
+                          {L"Close", Kind::Method},
                           {L"ConnectionString", Kind::Property}},
                          cConnectionString) {}
 
     bool isOpen() const noexcept { return db_ != nullptr; }
     const Database& database() const { return *db_; }
 
-protected:
+  protected:
     void call(DISPID id, bool put, const std::vector<VARIANT>& args, VARIANT* result) override {
         switch (id) {
         case cState:
@@ -84,28 +92,33 @@ protected:
         }
     }
 
-private:
+  private:
     void open(const std::vector<VARIANT>& args) {
         if (isOpen()) throw openError(kAdoConnection);
         if (!args.empty() && !isMissing(args[0])) connection_ = textArg(args[0]);
         const auto provider = connectionValue(connection_, "Provider");
         if (!provider || !equalsNoCase(*provider, kProvider))
             throw ComFailure{static_cast<HRESULT>(0x800A0E7A),
-                             "Provider cannot be found. It may not be properly installed.", kAdoConnection};
+                             "Provider cannot be found. It may not be properly installed.",
+                             kAdoConnection};
         const std::string path = connectionValue(connection_, "Data Source").value_or("");
-        const std::string password = connectionValue(connection_, "Jet OLEDB:Database Password").value_or("");
+        const std::string password =
+            connectionValue(connection_, "Jet OLEDB:Database Password").value_or("");
 
-        const HANDLE file = ::CreateFileA(path.c_str(), GENERIC_READ, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr,
-                                          OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr);
+        const HANDLE file =
+            ::CreateFileA(path.c_str(), GENERIC_READ, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr,
+                          OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr);
         if (file == INVALID_HANDLE_VALUE) {
             const DWORD e = ::GetLastError();
-            if (e == ERROR_FILE_NOT_FOUND || e == ERROR_PATH_NOT_FOUND || e == ERROR_INVALID_NAME || path.empty())
+            if (e == ERROR_FILE_NOT_FOUND || e == ERROR_PATH_NOT_FOUND || e == ERROR_INVALID_NAME ||
+                path.empty())
                 throw ComFailure{E_FAIL, "Could not find file '" + path + "'.", kEngine};
-            throw ComFailure{E_FAIL,
-                             "The Microsoft Access database engine cannot open or write to the file '" + path +
-                                 "'. It is already opened exclusively by another user, or you need "
-                                 "permission to view and write its data.",
-                             kEngine};
+            throw ComFailure{
+                E_FAIL,
+                "The Microsoft Access database engine cannot open or write to the file '" + path +
+                    "'. It is already opened exclusively by another user, or you need "
+                    "permission to view and write its data.",
+                kEngine};
         }
         std::string content;
         const DWORD size = ::GetFileSize(file, nullptr);
@@ -113,7 +126,8 @@ private:
         if (readOk) {
             content.resize(size);
             DWORD got = 0;
-            readOk = size == 0 || (::ReadFile(file, content.data(), size, &got, nullptr) && got == size);
+            readOk =
+                size == 0 || (::ReadFile(file, content.data(), size, &got, nullptr) && got == size);
         }
         ::CloseHandle(file);
         std::optional<Database> db;
@@ -132,11 +146,21 @@ private:
 class Recordset;
 
 enum RecordsetMember : DISPID {
-    rState = 1, rOpen, rClose, rFilter, rEOF, rBOF, rFields, rFind, rMoveFirst, rMoveNext, rRecordCount
+    rState = 1,
+    rOpen,
+    rClose,
+    rFilter,
+    rEOF,
+    rBOF,
+    rFields,
+    rFind,
+    rMoveFirst,
+    rMoveNext,
+    rRecordCount
 };
 
 class Recordset final : public DispatchObject {
-public:
+  public:
     Recordset()
         : DispatchObject("Recordset",
                          {{L"State", Kind::Property},
@@ -160,10 +184,10 @@ public:
         return rows_[view_[cursor_]][column];
     }
 
-protected:
+  protected:
     void call(DISPID id, bool put, const std::vector<VARIANT>& args, VARIANT* result) override;
 
-private:
+  private:
     void open(const std::vector<VARIANT>& args);
     void setFilter(const VARIANT& value);
     void find(const std::vector<VARIANT>& args);
@@ -180,15 +204,15 @@ private:
 };
 
 class Field final : public DispatchObject {
-public:
+  public:
     Field(Recordset* rs, std::size_t column)
-        : DispatchObject("Field", {{L"Value", Kind::Property}, {L"Name", Kind::Property}}, 1), rs_(rs),
-          column_(column) {
+        : DispatchObject("Field", {{L"Value", Kind::Property}, {L"Name", Kind::Property}}, 1),
+          rs_(rs), column_(column) {
         rs_->AddRef();
     }
     ~Field() override { rs_->Release(); }
 
-protected:
+  protected:
     void call(DISPID id, bool put, const std::vector<VARIANT>&, VARIANT* result) override {
         if (put) throw argumentsError(kAdoField);
         if (id == 2) {
@@ -196,25 +220,29 @@ protected:
             return;
         }
         const Cell& c = rs_->cell(column_, kAdoField);
-        if (std::holds_alternative<Null>(c)) result->vt = VT_NULL;
-        else if (auto i = std::get_if<std::int32_t>(&c)) setLong(result, *i);
-        else setText(result, std::get<std::string>(c));
+        if (std::holds_alternative<Null>(c))
+            result->vt = VT_NULL;
+        else if (auto i = std::get_if<std::int32_t>(&c))
+            setLong(result, *i);
+        else
+            setText(result, std::get<std::string>(c));
     }
 
-private:
+  private:
     Recordset* rs_;
     std::size_t column_;
 };
 
 class Fields final : public DispatchObject {
-public:
+  public:
     explicit Fields(Recordset* rs)
-        : DispatchObject("Fields", {{L"Item", Kind::Method}, {L"Count", Kind::Property}}, 1), rs_(rs) {
+        : DispatchObject("Fields", {{L"Item", Kind::Method}, {L"Count", Kind::Property}}, 1),
+          rs_(rs) {
         rs_->AddRef();
     }
     ~Fields() override { rs_->Release(); }
 
-protected:
+  protected:
     void call(DISPID id, bool put, const std::vector<VARIANT>& args, VARIANT* result) override {
         if (put) throw argumentsError(kAdoFields);
         if (!rs_->isOpen()) throw closedError(kAdoFields);
@@ -235,7 +263,7 @@ protected:
         setObject(result, new Field(rs_, *column));
     }
 
-private:
+  private:
     Recordset* rs_;
 };
 
@@ -301,24 +329,28 @@ void Recordset::open(const std::vector<VARIANT>& args) {
     if (args.size() < 2) throw argumentsError(kAdoRecordset);
     const auto* connection = dynamic_cast<const Connection*>(DispatchObject::fromVariant(args[1]));
     if (!connection || !connection->isOpen())
-        throw ComFailure{static_cast<HRESULT>(0x800A0E7D),
-                         "The connection cannot be used to perform this operation. It is either closed or "
-                         "invalid in this context.",
-                         kAdoRecordset};
+        throw ComFailure{
+            static_cast<HRESULT>(0x800A0E7D),
+            "The connection cannot be used to perform this operation. It is either closed or "
+            "invalid in this context.",
+            kAdoRecordset};
     const auto select = parseSelect(textArg(args[0]));
     if (!select)
         throw ComFailure{static_cast<HRESULT>(0x80040E14),
-                         "Invalid SQL statement; expected 'DELETE', 'INSERT', 'PROCEDURE', 'SELECT', or 'UPDATE'.",
+                         "Invalid SQL statement; expected 'DELETE', 'INSERT', 'PROCEDURE', "
+                         "'SELECT', or 'UPDATE'.",
                          kEngine};
     const Table* table = findTable(connection->database(), select->table);
     if (!table)
-        throw ComFailure{static_cast<HRESULT>(0x80040E37),
-                         "The Microsoft Access database engine cannot find the input table or query '" +
-                             select->table + "'. Make sure it exists and that its name is spelled correctly.",
-                         kEngine};
+        throw ComFailure{
+            static_cast<HRESULT>(0x80040E37),
+            "The Microsoft Access database engine cannot find the input table or query '" +
+                select->table + "'. Make sure it exists and that its name is spelled correctly.",
+            kEngine};
     std::vector<std::size_t> picked;
     if (select->columns.empty()) {
-        for (std::size_t i = 0; i < table->columns.size(); ++i) picked.push_back(i);
+        for (std::size_t i = 0; i < table->columns.size(); ++i)
+            picked.push_back(i);
     } else {
         for (const auto& name : select->columns) {
             const auto c = findColumn(table->columns, name);
@@ -330,14 +362,17 @@ void Recordset::open(const std::vector<VARIANT>& args) {
     }
     columns_.clear();
     rows_.clear();
-    for (std::size_t c : picked) columns_.push_back(table->columns[c]);
+    for (std::size_t c : picked)
+        columns_.push_back(table->columns[c]);
     for (const auto& row : table->rows) {
         std::vector<Cell> out;
-        for (std::size_t c : picked) out.push_back(row[c]);
+        for (std::size_t c : picked)
+            out.push_back(row[c]);
         rows_.push_back(std::move(out));
     }
     view_.clear();
-    for (std::size_t i = 0; i < rows_.size(); ++i) view_.push_back(i);
+    for (std::size_t i = 0; i < rows_.size(); ++i)
+        view_.push_back(i);
     cursor_ = 0;
     filter_.clear();
     open_ = true;
@@ -352,7 +387,8 @@ void Recordset::setFilter(const VARIANT& value) {
     }
     std::vector<std::size_t> view;
     if (text.empty()) {
-        for (std::size_t i = 0; i < rows_.size(); ++i) view.push_back(i);
+        for (std::size_t i = 0; i < rows_.size(); ++i)
+            view.push_back(i);
     } else {
         const auto condition = parseCondition(text);
         if (!condition) throw argumentsError(kAdoRecordset);
@@ -373,13 +409,17 @@ void Recordset::find(const std::vector<VARIANT>& args) {
     const auto column = findColumn(columns_, condition->column);
     if (!column) throw itemNotFound(kAdoRecordset);
     const long skip = args.size() > 1 && !isMissing(args[1]) ? longArg(args[1]) : 0;
-    const bool backward = args.size() > 2 && !isMissing(args[2]) && longArg(args[2]) == kSearchBackward;
+    const bool backward =
+        args.size() > 2 && !isMissing(args[2]) && longArg(args[2]) == kSearchBackward;
     long start = static_cast<long>(cursor_);
     if (args.size() > 3 && !isMissing(args[3])) {
         const long bookmark = longArg(args[3]);
-        if (bookmark == kBookmarkFirst) start = 0;
-        else if (bookmark == kBookmarkLast) start = static_cast<long>(view_.size()) - 1;
-        else throw argumentsError(kAdoRecordset);
+        if (bookmark == kBookmarkFirst)
+            start = 0;
+        else if (bookmark == kBookmarkLast)
+            start = static_cast<long>(view_.size()) - 1;
+        else
+            throw argumentsError(kAdoRecordset);
     } else if (cursor_ >= view_.size()) {
         throw noCurrentRecord(kAdoRecordset);
     }
@@ -396,7 +436,11 @@ void Recordset::find(const std::vector<VARIANT>& args) {
 
 } // namespace
 
-DispatchObject* newConnection() { return new Connection(); }
-DispatchObject* newRecordset() { return new Recordset(); }
+DispatchObject* newConnection() {
+    return new Connection();
+}
+DispatchObject* newRecordset() {
+    return new Recordset();
+}
 
 } // namespace hoststandin

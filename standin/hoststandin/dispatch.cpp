@@ -15,22 +15,29 @@ int g_serial = 0;
 
 std::wstring widen(std::string_view ansi) {
     if (ansi.empty()) return {};
-    const int n = ::MultiByteToWideChar(CP_ACP, 0, ansi.data(), static_cast<int>(ansi.size()), nullptr, 0);
+    const int n =
+        ::MultiByteToWideChar(CP_ACP, 0, ansi.data(), static_cast<int>(ansi.size()), nullptr, 0);
     std::wstring out(static_cast<std::size_t>(n > 0 ? n : 0), L'\0');
-    if (n > 0) ::MultiByteToWideChar(CP_ACP, 0, ansi.data(), static_cast<int>(ansi.size()), out.data(), n);
+    if (n > 0)
+        ::MultiByteToWideChar(CP_ACP, 0, ansi.data(), static_cast<int>(ansi.size()), out.data(), n);
     return out;
 }
 
 std::string narrow(const wchar_t* wide, std::size_t length) {
     if (!wide || !length) return {};
-    const int n = ::WideCharToMultiByte(CP_ACP, 0, wide, static_cast<int>(length), nullptr, 0, nullptr, nullptr);
+    const int n = ::WideCharToMultiByte(CP_ACP, 0, wide, static_cast<int>(length), nullptr, 0,
+                                        nullptr, nullptr);
     std::string out(static_cast<std::size_t>(n > 0 ? n : 0), '\0');
-    if (n > 0) ::WideCharToMultiByte(CP_ACP, 0, wide, static_cast<int>(length), out.data(), n, nullptr, nullptr);
+    if (n > 0)
+        ::WideCharToMultiByte(CP_ACP, 0, wide, static_cast<int>(length), out.data(), n, nullptr,
+                              nullptr);
     return out;
 }
 
-DispatchObject::DispatchObject(std::string className, std::vector<Member> members, DISPID defaultMember)
-    : className_(std::move(className)), members_(std::move(members)), defaultMember_(defaultMember) {
+DispatchObject::DispatchObject(std::string className, std::vector<Member> members,
+                               DISPID defaultMember)
+    : className_(std::move(className)), members_(std::move(members)),
+      defaultMember_(defaultMember) {
     label_ = className_ + "#" + std::to_string(++g_serial);
     ::InterlockedIncrement(&g_objects);
     logLine("new " + label_);
@@ -52,7 +59,9 @@ HRESULT DispatchObject::QueryInterface(REFIID riid, void** ppv) {
     return E_NOINTERFACE;
 }
 
-ULONG DispatchObject::AddRef() { return static_cast<ULONG>(::InterlockedIncrement(&refs_)); }
+ULONG DispatchObject::AddRef() {
+    return static_cast<ULONG>(::InterlockedIncrement(&refs_));
+}
 
 ULONG DispatchObject::Release() {
     const LONG n = ::InterlockedDecrement(&refs_);
@@ -65,12 +74,15 @@ HRESULT DispatchObject::GetTypeInfoCount(UINT* count) {
     return S_OK;
 }
 
-HRESULT DispatchObject::GetTypeInfo(UINT, LCID, ITypeInfo**) { return E_NOTIMPL; }
+HRESULT DispatchObject::GetTypeInfo(UINT, LCID, ITypeInfo**) {
+    return E_NOTIMPL;
+}
 
 HRESULT DispatchObject::GetIDsOfNames(REFIID, LPOLESTR* names, UINT count, LCID, DISPID* ids) {
     if (!names || !ids || count == 0) return E_INVALIDARG;
     HRESULT hr = S_OK;
-    for (UINT i = 0; i < count; ++i) ids[i] = DISPID_UNKNOWN;
+    for (UINT i = 0; i < count; ++i)
+        ids[i] = DISPID_UNKNOWN;
     for (std::size_t m = 0; m < members_.size(); ++m)
         if (_wcsicmp(names[0], members_[m].name) == 0) ids[0] = static_cast<DISPID>(m + 1);
     if (ids[0] == DISPID_UNKNOWN) {
@@ -104,7 +116,8 @@ HRESULT DispatchObject::Invoke(DISPID id, REFIID, LCID, WORD flags, DISPPARAMS* 
         line += " = " + (args.empty() ? std::string("?") : describe(args.back()));
     } else if (member.kind == Kind::Method || !args.empty()) {
         line += "(";
-        for (std::size_t i = 0; i < args.size(); ++i) line += (i ? ", " : "") + describe(args[i]);
+        for (std::size_t i = 0; i < args.size(); ++i)
+            line += (i ? ", " : "") + describe(args[i]);
         line += ")";
     }
 
@@ -114,8 +127,10 @@ HRESULT DispatchObject::Invoke(DISPID id, REFIID, LCID, WORD flags, DISPPARAMS* 
     try {
         call(id, put, args, &out);
         if (!put) line += " -> " + describe(out);
-        if (result) *result = out;
-        else ::VariantClear(&out);
+        if (result)
+            *result = out;
+        else
+            ::VariantClear(&out);
     } catch (const ComFailure& f) {
         ::VariantClear(&out);
         line += " -> error 0x";
@@ -132,15 +147,18 @@ HRESULT DispatchObject::Invoke(DISPID id, REFIID, LCID, WORD flags, DISPPARAMS* 
         }
         hr = DISP_E_EXCEPTION;
     }
-    for (VARIANT& v : args) ::VariantClear(&v);
+    for (VARIANT& v : args)
+        ::VariantClear(&v);
     logLine(line);
     return hr;
 }
 
 DispatchObject* DispatchObject::fromVariant(const VARIANT& v) {
     IUnknown* unknown = nullptr;
-    if (v.vt == VT_DISPATCH) unknown = v.pdispVal;
-    else if (v.vt == VT_UNKNOWN) unknown = v.punkVal;
+    if (v.vt == VT_DISPATCH)
+        unknown = v.pdispVal;
+    else if (v.vt == VT_UNKNOWN)
+        unknown = v.punkVal;
     if (!unknown) return nullptr;
     void* ours = nullptr;
     if (FAILED(unknown->QueryInterface(IID_IStandInObject, &ours)) || !ours) return nullptr;
@@ -151,10 +169,14 @@ DispatchObject* DispatchObject::fromVariant(const VARIANT& v) {
 
 std::string describe(const VARIANT& v) {
     switch (v.vt) {
-    case VT_EMPTY: return "Empty";
-    case VT_NULL: return "Null";
-    case VT_BOOL: return v.boolVal ? "True" : "False";
-    case VT_ERROR: return v.scode == DISP_E_PARAMNOTFOUND ? "missing" : "error";
+    case VT_EMPTY:
+        return "Empty";
+    case VT_NULL:
+        return "Null";
+    case VT_BOOL:
+        return v.boolVal ? "True" : "False";
+    case VT_ERROR:
+        return v.scode == DISP_E_PARAMNOTFOUND ? "missing" : "error";
     case VT_DISPATCH:
     case VT_UNKNOWN: {
         const DispatchObject* o = DispatchObject::fromVariant(v);
@@ -189,7 +211,9 @@ std::string describe(const VARIANT& v) {
     }
 }
 
-bool isMissing(const VARIANT& v) { return v.vt == VT_ERROR && v.scode == DISP_E_PARAMNOTFOUND; }
+bool isMissing(const VARIANT& v) {
+    return v.vt == VT_ERROR && v.scode == DISP_E_PARAMNOTFOUND;
+}
 
 std::string textArg(const VARIANT& v) {
     if (v.vt == VT_BSTR) return narrow(v.bstrVal, ::SysStringLen(v.bstrVal));
@@ -207,7 +231,8 @@ std::string textArg(const VARIANT& v) {
 long longArg(const VARIANT& v) {
     VARIANT t;
     ::VariantInit(&t);
-    if (v.vt == VT_DISPATCH || isMissing(v) || FAILED(::VariantChangeType(&t, const_cast<VARIANT*>(&v), 0, VT_I4)))
+    if (v.vt == VT_DISPATCH || isMissing(v) ||
+        FAILED(::VariantChangeType(&t, const_cast<VARIANT*>(&v), 0, VT_I4)))
         throw ComFailure{kTypeMismatch, "Type mismatch", "HostStandIn"};
     return t.lVal;
 }
@@ -244,8 +269,9 @@ void logLine(const std::string& line) {
             if (c == '/') c = '\\';
         target = "Z:" + target;
     }
-    const HANDLE file = ::CreateFileA(target.c_str(), FILE_APPEND_DATA, FILE_SHARE_READ | FILE_SHARE_WRITE,
-                                      nullptr, OPEN_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
+    const HANDLE file =
+        ::CreateFileA(target.c_str(), FILE_APPEND_DATA, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr,
+                      OPEN_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
     if (file == INVALID_HANDLE_VALUE) return;
     const std::string text = line + "\n";
     DWORD written = 0;

@@ -2,8 +2,8 @@
 // DISP_E_EXCEPTION with the scode and text the caller reports, and one log line per call.
 #pragma once
 
-#include <windows.h>
 #include <oleauto.h>
+#include <windows.h>
 
 #include <string>
 #include <string_view>
@@ -30,7 +30,7 @@ inline constexpr IID IID_IStandInObject = {
     0x4c1b0b52, 0x7a0e, 0x4b8f, {0x9e, 0x59, 0x2d, 0x7a, 0x3c, 0x6b, 0x8e, 0x11}};
 
 class DispatchObject : public IDispatch {
-public:
+  public:
     DispatchObject(std::string className, std::vector<Member> members, DISPID defaultMember);
     virtual ~DispatchObject();
     DispatchObject(const DispatchObject&) = delete;
@@ -50,12 +50,12 @@ public:
     // Our own object behind a VARIANT, or null (no reference added).
     static DispatchObject* fromVariant(const VARIANT& v);
 
-protected:
+  protected:
     // DISPIDs are member indexes + 1. `args` in call order (missing arguments included);
     // for a property put the value is `args.back()`. Throws ComFailure.
     virtual void call(DISPID id, bool put, const std::vector<VARIANT>& args, VARIANT* result) = 0;
 
-private:
+  private:
     LONG refs_ = 1;
     std::string className_;
     std::string label_;

@@ -17,7 +17,8 @@ int hexValue(char c) {
 std::string mix(std::string_view bytes, std::string_view key) {
     std::string out(bytes);
     for (std::size_t i = 0; i < out.size(); ++i) {
-        const auto k = key.empty() ? std::uint8_t(0) : static_cast<std::uint8_t>(key[i % key.size()]);
+        const auto k =
+            key.empty() ? std::uint8_t(0) : static_cast<std::uint8_t>(key[i % key.size()]);
         out[i] = static_cast<char>(static_cast<std::uint8_t>(out[i]) ^ k ^
                                    static_cast<std::uint8_t>(i * 29 + 11));
     }
@@ -48,7 +49,9 @@ std::optional<std::string> fromHex(std::string_view hex) {
     return out;
 }
 
-std::string encipher(std::string_view plain, std::string_view key) { return toHex(mix(plain, key)); }
+std::string encipher(std::string_view plain, std::string_view key) {
+    return toHex(mix(plain, key));
+}
 
 std::optional<std::string> decipher(std::string_view text, std::string_view key) {
     auto bytes = fromHex(text);

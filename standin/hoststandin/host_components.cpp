@@ -26,12 +26,13 @@ std::string planText() {
 }
 
 class ZarnPlan final : public DispatchObject {
-public:
+  public:
     ZarnPlan() : DispatchObject("clsZarnPlan", {{L"getPlanName", Kind::Method}}, kGetPlanName) {}
 
-protected:
+  protected:
     void call(DISPID, bool, const std::vector<VARIANT>& args, VARIANT* result) override {
-        if (args.size() != 1) throw ComFailure{DISP_E_BADPARAMCOUNT, "Wrong number of arguments", "QvlZarnPlan"};
+        if (args.size() != 1)
+            throw ComFailure{DISP_E_BADPARAMCOUNT, "Wrong number of arguments", "QvlZarnPlan"};
         if (textArg(args[0]) != kPlanCode)
             throw ComFailure{kInvalidCall, "Invalid plan code", "QvlZarnPlan.clsZarnPlan"};
         setText(result, encipher(planText(), kSecretKey));
@@ -39,34 +40,44 @@ protected:
 };
 
 class Protect final : public DispatchObject {
-public:
+  public:
     Protect()
-        : DispatchObject("clsProtect", {{L"SecretKey", Kind::Property}, {L"DecryptURL", Kind::Method}},
+        : DispatchObject("clsProtect",
+                         {{L"SecretKey", Kind::Property}, {L"DecryptURL", Kind::Method}},
                          kDecryptURL) {}
 
-protected:
+  protected:
     void call(DISPID id, bool put, const std::vector<VARIANT>& args, VARIANT* result) override {
         if (id == kSecretKeyMember) {
-            if (!put) throw ComFailure{kInvalidCall, "SecretKey can only be set", "QVLEncryption.clsProtect"};
+            if (!put)
+                throw ComFailure{kInvalidCall, "SecretKey can only be set",
+                                 "QVLEncryption.clsProtect"};
             if (textArg(args.back()) != kSecretKey)
-                throw ComFailure{kInvalidCall, "Secret key not accepted", "QVLEncryption.clsProtect"};
+                throw ComFailure{kInvalidCall, "Secret key not accepted",
+                                 "QVLEncryption.clsProtect"};
             keyAccepted_ = true;
             return;
         }
-        if (args.size() != 1) throw ComFailure{DISP_E_BADPARAMCOUNT, "Wrong number of arguments", "QVLEncryption"};
+        if (args.size() != 1)
+            throw ComFailure{DISP_E_BADPARAMCOUNT, "Wrong number of arguments", "QVLEncryption"};
         if (!keyAccepted_)
             throw ComFailure{kInvalidCall, "No secret key given", "QVLEncryption.clsProtect"};
         const auto plain = decipher(textArg(args[0]), kSecretKey);
-        if (!plain) throw ComFailure{kInvalidCall, "Not an enciphered text", "QVLEncryption.clsProtect"};
+        if (!plain)
+            throw ComFailure{kInvalidCall, "Not an enciphered text", "QVLEncryption.clsProtect"};
         setText(result, *plain);
     }
 
-private:
+  private:
     bool keyAccepted_ = false;
 };
 } // namespace
 
-DispatchObject* newZarnPlan() { return new ZarnPlan(); }
-DispatchObject* newProtect() { return new Protect(); }
+DispatchObject* newZarnPlan() {
+    return new ZarnPlan();
+}
+DispatchObject* newProtect() {
+    return new Protect();
+}
 
 } // namespace hoststandin

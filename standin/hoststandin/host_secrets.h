@@ -8,7 +8,13 @@
 namespace hoststandin {
 
 inline constexpr std::string_view kPlanCode = "QK$27NOV";
-inline constexpr std::string_view kSecretKey = "Q" "\x07" "v" "\xA7" "L" "\x1F" "z";
+inline constexpr std::string_view kSecretKey = "Q"
+                                               "\x07"
+                                               "v"
+                                               "\xA7"
+                                               "L"
+                                               "\x1F"
+                                               "z";
 inline constexpr std::string_view kDatabasePassword = "Zn#27-Orv!Plan";
 inline constexpr std::string_view kPlanText = "Zn#27-Orv!Plan~QVL~ZARN~2027";
 

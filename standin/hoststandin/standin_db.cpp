@@ -12,8 +12,10 @@ namespace {
 constexpr std::string_view kMagic = "HOSTSTANDIN DATABASE 1";
 
 std::string_view trim(std::string_view s) {
-    while (!s.empty() && (s.front() == ' ' || s.front() == '\t')) s.remove_prefix(1);
-    while (!s.empty() && (s.back() == ' ' || s.back() == '\t' || s.back() == '\r')) s.remove_suffix(1);
+    while (!s.empty() && (s.front() == ' ' || s.front() == '\t'))
+        s.remove_prefix(1);
+    while (!s.empty() && (s.back() == ' ' || s.back() == '\t' || s.back() == '\r'))
+        s.remove_suffix(1);
     return s;
 }
 
@@ -21,9 +23,11 @@ std::vector<std::string_view> words(std::string_view line) {
     std::vector<std::string_view> out;
     std::size_t i = 0;
     while (i < line.size()) {
-        while (i < line.size() && line[i] == ' ') ++i;
+        while (i < line.size() && line[i] == ' ')
+            ++i;
         const std::size_t start = i;
-        while (i < line.size() && line[i] != ' ') ++i;
+        while (i < line.size() && line[i] != ' ')
+            ++i;
         if (i > start) out.push_back(line.substr(start, i - start));
     }
     return out;
@@ -70,14 +74,18 @@ std::string serialize(const Database& db) {
     out << kMagic << "\npassword " << toHex(db.password) << "\n";
     for (const Table& t : db.tables) {
         out << "table " << t.name << "\n";
-        for (const auto& c : t.columns) out << "column " << c << "\n";
+        for (const auto& c : t.columns)
+            out << "column " << c << "\n";
         for (const auto& row : t.rows) {
             out << "row";
             for (const Cell& cell : row) {
                 out << ' ';
-                if (std::holds_alternative<Null>(cell)) out << 'N';
-                else if (auto i = std::get_if<std::int32_t>(&cell)) out << 'I' << *i;
-                else out << 'S' << toHex(std::get<std::string>(cell));
+                if (std::holds_alternative<Null>(cell))
+                    out << 'N';
+                else if (auto i = std::get_if<std::int32_t>(&cell))
+                    out << 'I' << *i;
+                else
+                    out << 'S' << toHex(std::get<std::string>(cell));
             }
             out << "\n";
         }
@@ -145,7 +153,8 @@ const Table* findTable(const Database& db, std::string_view name) {
     return nullptr;
 }
 
-std::optional<std::size_t> findColumn(const std::vector<std::string>& columns, std::string_view name) {
+std::optional<std::size_t> findColumn(const std::vector<std::string>& columns,
+                                      std::string_view name) {
     for (std::size_t i = 0; i < columns.size(); ++i)
         if (equalsNoCase(columns[i], trim(name))) return i;
     return std::nullopt;
@@ -161,14 +170,16 @@ std::optional<Select> parseSelect(std::string_view sql) {
         if (equalsNoCase(w[k], "from")) from = k;
     if (from < 2 || from + 2 != w.size() || !isName(w[from + 1])) return std::nullopt;
     std::string list;
-    for (std::size_t k = 1; k < from; ++k) list += std::string(w[k]);
+    for (std::size_t k = 1; k < from; ++k)
+        list += std::string(w[k]);
     Select s;
     s.table = std::string(w[from + 1]);
     if (list == "*") return s;
     std::size_t pos = 0;
     for (;;) {
         const auto comma = list.find(',', pos);
-        const std::string name = list.substr(pos, comma == std::string::npos ? std::string::npos : comma - pos);
+        const std::string name =
+            list.substr(pos, comma == std::string::npos ? std::string::npos : comma - pos);
         if (!isName(name)) return std::nullopt;
         s.columns.push_back(name);
         if (comma == std::string::npos) break;

@@ -41,7 +41,8 @@ std::optional<Database> parse(std::string_view text);
 
 bool equalsNoCase(std::string_view a, std::string_view b);
 const Table* findTable(const Database& db, std::string_view name);
-std::optional<std::size_t> findColumn(const std::vector<std::string>& columns, std::string_view name);
+std::optional<std::size_t> findColumn(const std::vector<std::string>& columns,
+                                      std::string_view name);
 
 // "SELECT * FROM t" or "SELECT a,b FROM t", any case, blanks around the parts.
 struct Select {

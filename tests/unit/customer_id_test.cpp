@@ -64,14 +64,14 @@ TEST(CustomerId, NumbersConvertAsTheyStand) {
 TEST(CustomerId, OtherTextsTakeTheFirstCodeAndTheLastFiveCharacters) {
     EXPECT_EQ(fnDeriveCustID("X-10042"), 8810042);
     EXPECT_EQ(fnDeriveCustID("CUST-000-12345"), 6712345);
-    EXPECT_EQ(fnDeriveCustID(".e5"), 4600000); // five characters or fewer: "46" + ".e5"
+    EXPECT_EQ(fnDeriveCustID(".e5"), 4600000);         // five characters or fewer: "46" + ".e5"
     EXPECT_EQ(fnDeriveCustID("\xE9-00001"), 23300001); // ANSI code above 127 stays positive
-    EXPECT_EQ(fnDeriveCustID("ID:00002.5"), 73002); // "73002.5", half to even
+    EXPECT_EQ(fnDeriveCustID("ID:00002.5"), 73002);    // "73002.5", half to even
 }
 
 TEST(CustomerId, TextsThatStayNoNumberAreErrorsNotIdentities) {
-    EXPECT_EQ(errorNumberOf("AB"), kErrTypeMismatchNumber);        // "65AB"
-    EXPECT_EQ(errorNumberOf("ABC 12.5"), kErrTypeMismatchNumber);  // "65 12.5": inner blank
+    EXPECT_EQ(errorNumberOf("AB"), kErrTypeMismatchNumber);       // "65AB"
+    EXPECT_EQ(errorNumberOf("ABC 12.5"), kErrTypeMismatchNumber); // "65 12.5": inner blank
     EXPECT_EQ(errorNumberOf(std::string{'A', '\0', '1', '2'}), kErrTypeMismatchNumber);
     EXPECT_EQ(errorNumberOf(std::string{'7', '\0'}), kErrTypeMismatchNumber); // "557\0"
     EXPECT_EQ(errorNumberOf(""), 5);

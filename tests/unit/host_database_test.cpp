@@ -27,10 +27,13 @@ struct FakeHostDatabase : HostDatabasePort {
         explicit Recordset(FakeHostDatabase& d) : db(d) { showAll(); }
         void showAll() {
             view.clear();
-            for (std::size_t i = 0; i < db.rows.size(); ++i) view.push_back(i);
+            for (std::size_t i = 0; i < db.rows.size(); ++i)
+                view.push_back(i);
             cursor = 0;
         }
-        int planIn(const std::string& criteria) { return std::stoi(criteria.substr(criteria.find('=') + 1)); }
+        int planIn(const std::string& criteria) {
+            return std::stoi(criteria.substr(criteria.find('=') + 1));
+        }
         void clearFilter() override {
             db.calls.push_back("clearFilter");
             showAll();
@@ -74,7 +77,8 @@ struct FakeHostDatabase : HostDatabasePort {
     }
     std::string plainSettings(const std::string& stored) override {
         calls.push_back("plain " + stored);
-        if (stored.rfind("enc:", 0) != 0) throw CheckerError(5, "DecryptURL", "Not an enciphered text");
+        if (stored.rfind("enc:", 0) != 0)
+            throw CheckerError(5, "DecryptURL", "Not an enciphered text");
         return stored.substr(4);
     }
 };
@@ -104,10 +108,10 @@ TEST(SettingsRead, RowWithCustomerIdFlagReadsTheCustomerRow) {
     fnReadSettings(db, 14, r);
     EXPECT_TRUE(r.blnUseCustID);
     EXPECT_EQ(r.lngCustID, 8810042);
-    EXPECT_EQ(db.calls, (std::vector<std::string>{
-                            "open Select * from PlanIDs ", "clearFilter", "filter Plan = 999",
-                            "field Settings", "clearFilter", "filter Plan = 14", "field Settings",
-                            "plain enc:X-10042", "close"}));
+    EXPECT_EQ(db.calls, (std::vector<std::string>{"open Select * from PlanIDs ", "clearFilter",
+                                                  "filter Plan = 999", "field Settings",
+                                                  "clearFilter", "filter Plan = 14",
+                                                  "field Settings", "plain enc:X-10042", "close"}));
 }
 
 TEST(SettingsRead, NoFlagRowOrANullOneLeavesTheCustomerRowAlone) {
@@ -118,7 +122,8 @@ TEST(SettingsRead, NoFlagRowOrANullOneLeavesTheCustomerRowAlone) {
         fnReadSettings(db, 14, r);
         EXPECT_FALSE(r.blnUseCustID);
         EXPECT_EQ(r.lngCustID, 0);
-        for (const auto& call : db.calls) EXPECT_EQ(call.find("14"), std::string::npos) << call;
+        for (const auto& call : db.calls)
+            EXPECT_EQ(call.find("14"), std::string::npos) << call;
         EXPECT_EQ(db.calls.back(), "close");
     }
 }
@@ -147,8 +152,9 @@ TEST(GetVersion, VersionThenTheTrimmedStoredCustomerTextInPlainForm) {
     EXPECT_EQ(r.strMajorVersion, "10.3");
     EXPECT_EQ(r.strMinorVersion, "3");
     EXPECT_EQ(r.strCustCode, " C-7"); // the plain text itself is not trimmed
-    EXPECT_EQ(db.calls, (std::vector<std::string>{"open Select settings,plan from planids", "find plan = 14", "firstField", "plain enc: C-7",
-                                                  "close"}));
+    EXPECT_EQ(db.calls,
+              (std::vector<std::string>{"open Select settings,plan from planids", "find plan = 14",
+                                        "firstField", "plain enc: C-7", "close"}));
 }
 
 TEST(GetVersion, SecondProductUsesItsOwnExecutableAndRow) {
@@ -176,7 +182,8 @@ TEST(GetVersion, NoVersionEndsBeforeTheDatabaseAndBadVersionsAreErrors) {
     EXPECT_FALSE(fnGetVersion(files, db, standAlone(), "C:\\app", r));
     EXPECT_TRUE(db.calls.empty());
     files.versions["C:\\app\\OZPLICNew.EXE"] = "7"; // one part: no second part
-    EXPECT_EQ(errorOf([&] { fnGetVersion(files, db, standAlone(), "C:\\app", r); }), kErrSubscriptOutOfRange);
+    EXPECT_EQ(errorOf([&] { fnGetVersion(files, db, standAlone(), "C:\\app", r); }),
+              kErrSubscriptOutOfRange);
     fakes::FakeFiles none;
     EXPECT_EQ(errorOf([&] { fnGetVersion(none, db, standAlone(), "C:\\app", r); }), 53);
     db.rows = {{14, std::nullopt}};

@@ -11,12 +11,13 @@ using namespace hoststandin;
 
 TEST(HostCipher, RoundTripsEveryByteAndRefusesWhatIsNotCiphertext) {
     std::string all;
-    for (int i = 0; i < 256; ++i) all.push_back(static_cast<char>(i));
+    for (int i = 0; i < 256; ++i)
+        all.push_back(static_cast<char>(i));
     EXPECT_EQ(*decipher(encipher(all, kSecretKey), kSecretKey), all);
     EXPECT_EQ(*decipher("", kSecretKey), "");
     EXPECT_NE(encipher("4711", kSecretKey), toHex("4711")); // really enciphered
     EXPECT_NE(*decipher(encipher("4711", kSecretKey), "another"), "4711");
-    EXPECT_FALSE(decipher("ABC", kSecretKey));  // odd length
+    EXPECT_FALSE(decipher("ABC", kSecretKey));   // odd length
     EXPECT_FALSE(decipher(" 4711", kSecretKey)); // blanks are not hex digits
     EXPECT_FALSE(decipher("GG", kSecretKey));
 }
