@@ -2,8 +2,9 @@
 // DISP_E_EXCEPTION with the scode and text the caller reports, and one log line per call.
 #pragma once
 
-#include <oleauto.h>
 #include <windows.h>
+// after windows.h
+#include <oleauto.h>
 
 #include <string>
 #include <string_view>

@@ -1,7 +1,8 @@
 // The in-process server: class factories for the four stand-in classes, and the registration
 // that points their program identifiers (ADO's included) at this DLL.
-#include <olectl.h>
 #include <windows.h>
+// after windows.h
+#include <olectl.h>
 
 #include <string>
 
