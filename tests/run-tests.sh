@@ -11,16 +11,18 @@ passed=0; failed=0
 
 count_gtest() { # $1 label, $2 log
     local ok bad
-    ok=$(grep -c '^\[       OK \]' "$2" || true)
-    bad=$(grep -cE '^\[  FAILED  \] [A-Za-z0-9_]+\.[A-Za-z0-9_/]+' "$2" || true)
-    if ! grep -q '^\[  PASSED  \]' "$2" && [ "$bad" -eq 0 ]; then bad=1; fi # crashed before the end
+    # gtest's own closing lines: "[  PASSED  ] N tests." and "[  FAILED  ] N tests, listed below:"
+    ok=$(sed -n 's/^\[  PASSED  \] \([0-9]*\) test.*/\1/p' "$2" | tail -n1)
+    bad=$(sed -n 's/^\[  FAILED  \] \([0-9]*\) test.*/\1/p' "$2" | tail -n1)
+    ok=${ok:-0}; bad=${bad:-0}
+    if ! grep -q '^\[==========\] .* ran' "$2"; then bad=$((bad + 1)); fi # crashed before the end
     echo "$1: $ok passed, $bad failed"
     passed=$((passed + ok)); failed=$((failed + bad))
 }
 
 echo "== unit tests (native)"
-$BUILD/native/tests/unit/unit_tests --gtest_brief=1 >"$OUT/unit-native.log" 2>&1
-grep -E '^\[  FAILED  \]|Failure' "$OUT/unit-native.log" | head -20
+$BUILD/native/tests/unit/unit_tests >"$OUT/unit-native.log" 2>&1
+grep -E '^\[  FAILED  \]|: Failure$' "$OUT/unit-native.log" | head -20
 count_gtest "native" "$OUT/unit-native.log"
 
 . tests/e2e/lib.sh
@@ -28,10 +30,10 @@ E2E_FRESH=1 e2e_template_prefix >"$OUT/template.log" 2>&1 || { echo "cannot make
 
 echo "== unit tests (Windows build under Wine)"
 WINEPREFIX=$E2E_TEMPLATE WINEDEBUG=-all timeout 300 wine $BUILD/windows/tests/unit/unit_tests.exe \
-    --gtest_brief=1 >"$OUT/unit-wine.log" 2>&1
+    >"$OUT/unit-wine.log" 2>&1
 WINEPREFIX=$E2E_TEMPLATE wineserver -k 2>/dev/null || true
 tr -d '\r' <"$OUT/unit-wine.log" >"$OUT/unit-wine.txt"
-grep -E '^\[  FAILED  \]|Failure' "$OUT/unit-wine.txt" | head -20
+grep -E '^\[  FAILED  \]|: Failure$' "$OUT/unit-wine.txt" | head -20
 count_gtest "wine" "$OUT/unit-wine.txt"
 
 if [ "${1:-}" != "--unit-only" ]; then
