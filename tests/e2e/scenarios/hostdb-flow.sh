@@ -14,6 +14,12 @@ run_type() {
     : >"$HOSTSTANDIN_LOG"
     e2e_start_checker
     if e2e_wait_exit 10; then r=ended; else r=running; fi
+    # On a loaded machine start-up may still be reading: wait for the connection to go.
+    local i
+    for i in $(seq 60); do
+        [ "$r" = ended ] || grep -q '^Connection#3 released$' "$HOSTSTANDIN_LOG" && break
+        sleep 0.5
+    done
     cp "$HOSTSTANDIN_LOG" "$ARTEFACTS/hostdb-flow-$label.log"
 }
 has() { grep -qF -- "$1" "$HOSTSTANDIN_LOG"; }
