@@ -20,6 +20,7 @@ run_case() {
     for i in $(seq 40); do
         shown=$(e2e_msgbox_text); [ -n "$shown" ] && break
         e2e_running || break
+        grep -q '^Connection#3 released$' "$HOSTSTANDIN_LOG" && break
         sleep 0.5
     done
     if [ "$number" = running ]; then

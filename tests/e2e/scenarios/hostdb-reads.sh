@@ -6,7 +6,8 @@ export HOSTSTANDIN_LOG=$SCEN/hoststandin.log
 "$NATIVEBIN/hostkit" folder "$APP" --type standalone --cust-id X-10042 >/dev/null
 e2e_start_checker
 line=$(e2e_wait_window 20 --class CheckOZProUpdateMain) || fail "main window never appeared"
-sleep 1
+# The window exists from the start; wait until start-up has let go of the database.
+for i in $(seq 60); do grep -q '^Connection#3 released$' "$HOSTSTANDIN_LOG" && break; sleep 0.5; done
 check "checker keeps running" e2e_running
 check "main window hidden" [ "$(e2e_field "$line" visible)" = 0 ]
 check "no message shown" [ -z "$(e2e_msgbox_text)" ]
