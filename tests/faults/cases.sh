@@ -128,7 +128,7 @@ case_updater_missing() {
     fault_start; fault_wait_check 15; fault_wait_shown 150
     local x y
     x=$(e2e_field "$SHOWN_LINE" x); y=$(e2e_field "$SHOWN_LINE" y)
-    xdotool mousemove $((x + 58)) $((y + 127)) click 1
+    xdotool mousemove $((x + 58)) $((y + 119)) click 1
     e2e_wait_exit 15
     judge "box (file not found), end" "$(fault_state)" '^ended.*box: .+' 'OUTSIDE'
 }
