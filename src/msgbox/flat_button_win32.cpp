@@ -83,22 +83,7 @@ void KtrButton::setPicturePosition(std::int32_t value) {
 }
 
 LRESULT CALLBACK KtrButton::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
-    if (message == WM_NCCREATE) {
-        auto* self =
-            static_cast<KtrButton*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
-        self->hwnd_ = hwnd;
-        ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
-    }
-    auto* self = reinterpret_cast<KtrButton*>(::GetWindowLongPtrW(hwnd, GWLP_USERDATA));
-    if (message == WM_NCDESTROY) {
-        ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, 0);
-        if (self) self->hwnd_ = nullptr;
-        return ::DefWindowProcW(hwnd, message, wParam, lParam);
-    }
-    if (!self) return ::DefWindowProcW(hwnd, message, wParam, lParam);
-    LRESULT result = 0;
-    guarded([&] { result = self->WndProc(message, wParam, lParam); });
-    return result;
+    return dispatchToWindow<KtrButton, &KtrButton::hwnd_, &KtrButton::WndProc>(hwnd, message, wParam, lParam);
 }
 
 bool KtrButton::offerKey(WPARAM key, bool alt) {

@@ -342,22 +342,7 @@ void frmMsgBox::prPaint(HDC dc) {
 }
 
 LRESULT CALLBACK frmMsgBox::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
-    if (message == WM_NCCREATE) {
-        auto* self =
-            static_cast<frmMsgBox*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
-        self->hwnd_ = hwnd;
-        ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
-    }
-    auto* self = reinterpret_cast<frmMsgBox*>(::GetWindowLongPtrW(hwnd, GWLP_USERDATA));
-    if (message == WM_NCDESTROY) {
-        ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, 0);
-        if (self) self->hwnd_ = nullptr;
-        return ::DefWindowProcW(hwnd, message, wParam, lParam);
-    }
-    if (!self) return ::DefWindowProcW(hwnd, message, wParam, lParam);
-    LRESULT result = 0;
-    guarded([&] { result = self->WndProc(message, wParam, lParam); });
-    return result;
+    return dispatchToWindow<frmMsgBox, &frmMsgBox::hwnd_, &frmMsgBox::WndProc>(hwnd, message, wParam, lParam);
 }
 
 LRESULT frmMsgBox::WndProc(UINT message, WPARAM wParam, LPARAM lParam) {

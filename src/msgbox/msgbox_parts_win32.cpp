@@ -71,22 +71,7 @@ void MsgBoxPart::move(int xPx, int yPx, int widthPx, int heightPx) {
 }
 
 LRESULT CALLBACK MsgBoxPart::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
-    if (message == WM_NCCREATE) {
-        auto* self =
-            static_cast<MsgBoxPart*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
-        self->hwnd_ = hwnd;
-        ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
-    }
-    auto* self = reinterpret_cast<MsgBoxPart*>(::GetWindowLongPtrW(hwnd, GWLP_USERDATA));
-    if (message == WM_NCDESTROY) {
-        ::SetWindowLongPtrW(hwnd, GWLP_USERDATA, 0);
-        if (self) self->hwnd_ = nullptr;
-        return ::DefWindowProcW(hwnd, message, wParam, lParam);
-    }
-    if (!self) return ::DefWindowProcW(hwnd, message, wParam, lParam);
-    LRESULT result = 0;
-    guarded([&] { result = self->WndProc(message, wParam, lParam); });
-    return result;
+    return dispatchToWindow<MsgBoxPart, &MsgBoxPart::hwnd_, &MsgBoxPart::WndProc>(hwnd, message, wParam, lParam);
 }
 
 LRESULT MsgBoxPart::WndProc(UINT message, WPARAM wParam, LPARAM lParam) {

@@ -3,6 +3,7 @@
 #include <cmath>
 
 #include "common/constants.h"
+#include "common/window_win32.h"
 #include "service/system_date.h"
 
 namespace checker {
@@ -63,25 +64,8 @@ void frmCheckUpdate::setCaption(const std::string& caption) {
     ::SetWindowTextA(hwnd_, caption.c_str());
 }
 
-LRESULT CALLBACK frmCheckUpdate::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam,
-                                               LPARAM lParam) {
-    if (message == WM_NCCREATE) {
-        auto* create = reinterpret_cast<CREATESTRUCTA*>(lParam);
-        auto* self = static_cast<frmCheckUpdate*>(create->lpCreateParams);
-        self->hwnd_ = hwnd;
-        ::SetWindowLongPtrA(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(self));
-    }
-    auto* self = reinterpret_cast<frmCheckUpdate*>(::GetWindowLongPtrA(hwnd, GWLP_USERDATA));
-    if (message == WM_NCDESTROY) {
-        ::SetWindowLongPtrA(hwnd, GWLP_USERDATA, 0);
-        if (self) self->hwnd_ = nullptr;
-        ::PostQuitMessage(0);
-        return ::DefWindowProcA(hwnd, message, wParam, lParam);
-    }
-    if (!self) return ::DefWindowProcA(hwnd, message, wParam, lParam);
-    LRESULT result = 0;
-    guarded([&] { result = self->WndProc(message, wParam, lParam); });
-    return result;
+LRESULT CALLBACK frmCheckUpdate::StaticWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
+    return dispatchToWindow<frmCheckUpdate, &frmCheckUpdate::hwnd_, &frmCheckUpdate::WndProc>(hwnd, message, wParam, lParam);
 }
 
 LRESULT frmCheckUpdate::WndProc(UINT message, WPARAM wParam, LPARAM lParam) {
@@ -99,6 +83,10 @@ LRESULT frmCheckUpdate::WndProc(UINT message, WPARAM wParam, LPARAM lParam) {
             else if (LOWORD(wParam) == tray::kLabelIdCancel)
                 lblCancel_Click();
         }
+        return 0;
+    case WM_DESTROY:
+        // The only window: when it goes, the message loop ends and the program with it.
+        ::PostQuitMessage(0);
         return 0;
     case WM_ACTIVATE:
         if (LOWORD(wParam) != WA_INACTIVE) Form_Activate();
