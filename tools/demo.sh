@@ -85,7 +85,7 @@ say "== answering \"&Get Update\""
 x=$(e2e_field "$line" x); y=$(e2e_field "$line" y)
 # The label lies on the left button bar: 120, 1785 twips inside Picture1, 1500 x 255.
 # Picture1 sits 120 twips above the client area, so the label spans client y 111-128 px.
-xdotool mousemove $((x + 58)) $((y + 119)) click 1
+xdotool mousemove $((x + 58)) $((y + 119)) sleep 0.3 click 1
 for i in $(seq 60); do kill -0 "$CHECKER" 2>/dev/null || break; sleep 0.5; done
 if kill -0 "$CHECKER" 2>/dev/null; then say "the checker is still running"; exit 1; fi
 say "checker ended"

@@ -15,7 +15,8 @@ startup_case() { # name, expected, must, forbidden, hostkit options...; then edi
     fault_folder "$@"
     [ -n "${EDIT:-}" ] && eval "$EDIT"
     fault_start
-    e2e_wait_exit 10
+    fault_wait_startup
+    fault_answer_box
     judge "$expected" "$(fault_state)" "$must" "$forbidden"
 }
 
@@ -39,7 +40,7 @@ case_database_locked() {
     fault_folder --type standalone --cust-id 4711
     (cd "$APP" && exec wine "$WINBIN/lockfile.exe" "$(winpath "$APP/data/Ozp.ACCDB")") >/dev/null 2>&1 &
     E2E_PIDS+=($!); sleep 3
-    fault_start; e2e_wait_exit 10
+    fault_start; fault_wait_startup; fault_answer_box
     judge "box with number and description, end" "$(fault_state)" '^ended.*box: .+' 'OUTSIDE'
 }
 case_host_exe_missing() { startup_case host-exe-missing "box (file not found), end" '^ended.*box: .+' 'OUTSIDE' --type standalone --cust-id 4711 --no-exe; }
@@ -83,7 +84,11 @@ update_ini_case() { # name, expected, must, forbidden, preparation
 }
 case_update_ini_empty() { update_ini_case update-ini-empty "shown, today's date written" '^running, shown, Update.INI CurrDate=.+' "$CLEAN" ': >"$APP/Update.INI"'; }
 case_update_ini_damaged() { update_ini_case update-ini-damaged "shown, today's date written" '^running, shown, Update.INI CurrDate=[0-9]' "$CLEAN" 'printf "[General]\r\nCurrDate=\xff\xfe##garbage##\r\n" >"$APP/Update.INI"'; }
-case_update_ini_read_only() { update_ini_case update-ini-read-only "shown, file unchanged" '^running, shown, Update.INI CurrDate=01/01/2001' "$CLEAN" 'printf "[General]\r\nCurrDate=01/01/2001\r\n" >"$APP/Update.INI"; chmod 444 "$APP/Update.INI"'; }
+# Immutable, since root may write a file whatever its mode.
+case_update_ini_read_only() {
+    update_ini_case update-ini-read-only "shown, file unchanged" '^running, shown, Update.INI CurrDate=01/01/2001' "$CLEAN" 'printf "[General]\r\nCurrDate=01/01/2001\r\n" >"$APP/Update.INI"; chattr +i "$APP/Update.INI"'
+    chattr -i "$APP/Update.INI"
+}
 case_update_ini_folder() { update_ini_case update-ini-folder "shown, folder kept" '^running, shown, Update.INI folder' "$CLEAN" 'mkdir "$APP/Update.INI"; touch "$APP/Update.INI/keep"'; }
 
 # ---- UpdateInfo.INI on a network client
@@ -115,7 +120,10 @@ case_patch_in_use() {
     cp "$WINBIN/OZProPatch.exe" "$APP/Patch.exe"
     (cd "$APP" && exec wine "$WINBIN/lockfile.exe" "$(winpath "$APP/Patch.exe")") >/dev/null 2>&1 &
     E2E_PIDS+=($!); sleep 3
-    fault_start; e2e_wait_exit 20
+    fault_start
+    local i
+    for i in $(seq 60); do [ -n "$(e2e_msgbox_text)" ] && break; e2e_running || break; sleep 1; done
+    fault_answer_box
     judge "box (copy fails), end; nothing started" "$(fault_state)" '^ended.*box: .+' 'OUTSIDE'
 }
 
@@ -128,14 +136,16 @@ case_updater_missing() {
     fault_start; fault_wait_check 15; fault_wait_shown 150
     local x y
     x=$(e2e_field "$SHOWN_LINE" x); y=$(e2e_field "$SHOWN_LINE" y)
-    xdotool mousemove $((x + 58)) $((y + 119)) click 1
-    e2e_wait_exit 15
+    xdotool mousemove $((x + 58)) $((y + 119)) sleep 0.3 click 1
+    local i
+    for i in $(seq 30); do [ -n "$(e2e_msgbox_text)" ] && break; e2e_running || break; sleep 1; done
+    fault_answer_box
     judge "box (file not found), end" "$(fault_state)" '^ended.*box: .+' 'OUTSIDE'
 }
 case_folder_blanks_non_ascii() {
     fault_begin folder-blanks-non-ascii
     local old=$APP
-    APP="$SCEN/Orvel Zarn Pro $(printf '\xe9t\xe9')"
+    APP="$SCEN/Orvel Zarn Pro été"  # é is in the ANSI code page the checker's paths use
     mkdir -p "$APP"; mv "$old/CheckOZProUpdate.exe" "$APP/"; rmdir "$old"
     fault_folder --type standalone --cust-id X-10042 --version 10.3.0.3
     fault_server --latest 1=10.4.0.5

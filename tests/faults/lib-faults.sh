@@ -4,6 +4,8 @@
 
 fault_begin() { # $1 case name, $2 screen size
     FAULT=$1
+    # A read-only case leaves an immutable file behind if it was cut short.
+    chattr -i "$BUILD/e2e/fault-$1/app/Update.INI" 2>/dev/null
     e2e_begin "fault-$1" "${2:-1024x768}" >/dev/null
     export HOSTSTANDIN_LOG=$SCEN/hoststandin.log
 }
@@ -31,11 +33,40 @@ fault_start() {
     e2e_start_checker
 }
 
-# Waits for the first check's time (97.5 s after start) plus settling, or for the end.
+# Waits for the first check (the first request the service logs, 97.5 s after start-up) and
+# then `extra` seconds more; without a service, for the check's time and the extra.
 fault_wait_check() { # [extra seconds after the check, default 12]
     local extra=${1:-12} deadline
-    deadline=$(($(date +%s) + 98 + extra))
-    while e2e_running && [ "$(date +%s)" -lt "$deadline" ]; do sleep 1; done
+    deadline=$(($(date +%s) + 200))
+    [ -z "${PORT:-}" ] && deadline=$(($(date +%s) + 110 + extra))
+    while e2e_running && [ "$(date +%s)" -lt "$deadline" ]; do
+        if [ -s "$SCEN/requests.log" ]; then sleep "$extra"; return; fi
+        sleep 1
+    done
+}
+
+# Waits until start-up is over: the checker ended, showed a box, or closed the host database.
+fault_wait_startup() {
+    local deadline=$(($(date +%s) + ${1:-90}))
+    while e2e_running && [ "$(date +%s)" -lt "$deadline" ]; do
+        [ -n "$(e2e_msgbox_text)" ] && return 0
+        if grep -qE 'Connection#[0-9]+ released' "$HOSTSTANDIN_LOG" 2>/dev/null; then sleep 2; return 0; fi
+        sleep 0.5
+    done
+}
+
+# Answers an error box the way a user would (its OK button) and waits for the end.
+fault_answer_box() {
+    [ -z "$(e2e_msgbox_text)" ] && return 0
+    local line hwnd i
+    for i in $(seq 20); do
+        line=$(e2e_windows --class '#32770' | head -n1)
+        [ -n "$line" ] && break
+        sleep 0.5
+    done
+    hwnd=$(e2e_field "$line" hwnd)
+    [ -n "$hwnd" ] && e2e_wine "$WINBIN/wininfo.exe" --post "$hwnd" 0x111 1 0 # WM_COMMAND, IDOK
+    e2e_wait_exit 30
 }
 
 # Waits up to $1 seconds for the window to stand topmost (the slide-in has ended).
@@ -61,7 +92,7 @@ fault_state() {
         wait "$CHECKER_PID" 2>/dev/null; s="ended($?)"
     fi
     local box
-    box=$(e2e_msgbox_text | head -n1 | tr -d '"' | cut -c1-60)
+    box=$(e2e_msgbox_text | head -n1 | sed 's/^L"//; s/"$//; s/\\n\\n/ /' | cut -c1-70)
     [ -n "$box" ] && s="$s, box: $box"
     if [ -d "$APP/Update.INI" ]; then s="$s, Update.INI folder"
     elif [ -f "$APP/Update.INI" ]; then s="$s, Update.INI $(grep -a -o 'CurrDate=[^[:cntrl:]]*' "$APP/Update.INI" | head -n1)"
