@@ -41,7 +41,7 @@ void Win32FilesPort::copyReplace(const std::string& from, const std::string& to)
 std::string Win32FilesPort::fileVersion(const std::string& path) {
     // A missing file is an error, as the scripting file-system object reports it.
     if (::GetFileAttributesA(path.c_str()) == INVALID_FILE_ATTRIBUTES)
-        throw CheckerError(53, "GetFileVersion", "File not found");
+        throw CheckerError(kErrFileNotFound, "GetFileVersion", "File not found");
     DWORD ignored = 0;
     const DWORD size = ::GetFileVersionInfoSizeA(path.c_str(), &ignored);
     if (size == 0) return {};

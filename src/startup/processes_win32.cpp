@@ -3,6 +3,7 @@
 #include <windows.h>
 #include <tlhelp32.h>
 
+#include "common/error.h"
 #include "common/files_win32.h"
 #include "common/unique_win32.h"
 
@@ -18,8 +19,13 @@ void Win32ProcessesPort::start(const std::string& path, int showState) {
     startup.wShowWindow = static_cast<WORD>(showState);
     PROCESS_INFORMATION info{};
     if (!::CreateProcessA(path.c_str(), commandLine.data(), nullptr, nullptr, FALSE, 0, nullptr,
-                          nullptr, &startup, &info))
+                          nullptr, &startup, &info)) {
+        // A missing program is the runtime's own "File not found", as for any other file.
+        const DWORD code = ::GetLastError();
+        if (code == ERROR_FILE_NOT_FOUND || code == ERROR_PATH_NOT_FOUND)
+            throw CheckerError(kErrFileNotFound, "Shell", "File not found");
         throwLastError("Shell");
+    }
     // Not waited for: the program runs on after the checker ends.
     UniqueHandle process(info.hProcess), thread(info.hThread);
 }

@@ -140,7 +140,7 @@ case_updater_missing() {
     local i
     for i in $(seq 30); do [ -n "$(e2e_msgbox_text)" ] && break; e2e_running || break; sleep 1; done
     fault_answer_box
-    judge "box (file not found), end" "$(fault_state)" '^ended.*box: .+' 'OUTSIDE'
+    judge "box 53 File not found, end" "$(fault_state)" "^ended.*box: .*'53'.*File not found" 'OUTSIDE'
 }
 case_folder_blanks_non_ascii() {
     fault_begin folder-blanks-non-ascii
