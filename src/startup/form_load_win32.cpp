@@ -1,5 +1,6 @@
 // Form_Load of frmCheckUpdate: the start-up sequence, in its fixed order.
 #include <windows.h>
+#include <objbase.h>
 
 #include "common/checker_folder.h"
 #include "common/profile_win32.h"
@@ -40,6 +41,9 @@ bool frmCheckUpdate::Form_Load() {
     if (record.blnUseCustID) prGetVersion();
     // 8. Nothing after start-up uses the host database.
     prCloseDatabase();
+    // The database provider and the host's components stay unused for the rest of the run:
+    // let their libraries go now instead of keeping them resident beside the tray icon.
+    ::CoFreeUnusedLibrariesEx(0, 0);
     // 9. Stay loaded and hidden.
     ::ShowWindow(hwnd_, SW_HIDE);
     return true;
