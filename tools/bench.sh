@@ -61,7 +61,7 @@ time_to_icon() {
     echo NaN
 }
 
-median() { sort -g | awk '{ a[NR] = $1 } END { if (NR % 2) print a[(NR + 1) / 2]; else printf "%.3f\n", (a[NR / 2] + a[NR / 2 + 1]) / 2 }'; }
+median() { sort -g | awk '{ a[NR] = $1 } END { if (NR % 2) print a[(NR + 1) / 2]; else printf "%g\n", (a[NR / 2] + a[NR / 2 + 1]) / 2 }'; }
 private_kib() { awk '/^Private_(Clean|Dirty)/ { s += $2 } END { print s }' "/proc/$1/smaps_rollup" 2>/dev/null; }
 # CPU time of all the process's threads in nanoseconds (the scheduler's own count).
 cpu_ns() { cat /proc/"$1"/task/*/schedstat 2>/dev/null | awk '{ s += $1 } END { printf "%.0f", s }'; }
