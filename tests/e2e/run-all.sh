@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
 # Runs the end-to-end scenarios side by side (most of them wait on the checker's timers).
-# Each prints PASS/FAIL lines; figures come out as "FIGURE name: value" lines.
+# Each prints PASS/FAIL lines (at most 20 minutes each); figures come out as "FIGURE name: value" lines.
 #   tests/e2e/run-all.sh [NAME...]   (default: every scenarios/*.sh)
 set -uo pipefail
 ROOT=${ROOT:-$(cd "$(dirname "$0")/../.." && pwd)}
@@ -16,4 +16,4 @@ else
 fi
 mkdir -p "$BUILD/e2e"
 printf '%s\n' "${scenarios[@]}" |
-    xargs -P "$PARALLEL" -I{} bash -c 'n=$(basename {} .sh); timeout 900 bash {} >$BUILD/e2e/$n.out 2>&1; rc=$?; grep -E "^(PASS|FAIL|FIGURE) " $BUILD/e2e/$n.out; [ $rc -eq 0 ] || grep -qE "^FAIL " $BUILD/e2e/$n.out || echo "FAIL $n: scenario exited $rc (see $BUILD/e2e/$n.out)"'
+    xargs -P "$PARALLEL" -I{} bash -c 'n=$(basename {} .sh); timeout 1200 bash {} >$BUILD/e2e/$n.out 2>&1; rc=$?; grep -E "^(PASS|FAIL|FIGURE) " $BUILD/e2e/$n.out; [ $rc -eq 0 ] || grep -qE "^FAIL " $BUILD/e2e/$n.out || echo "FAIL $n: scenario exited $rc (see $BUILD/e2e/$n.out)"'
