@@ -7,7 +7,7 @@ e2e_begin tray-slide-1280 1280x1024
 svc_start --latest 1=10.4.0.5
 tray_folder
 tray_start
-if tray_wait_shown 500; then
+if tray_wait_shown 840; then
     e2e_screenshot 3-shown >/dev/null
     figure "slide-in on 1280x1024 under Wine: $(awk -v a="$FIRST_VISIBLE" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
     check "stops at 6150 twips = 410 px (y=$(e2e_field "$SHOWN_LINE" y))" [ "$(e2e_field "$SHOWN_LINE" y)" = 410 ]

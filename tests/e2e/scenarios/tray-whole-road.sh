@@ -24,7 +24,7 @@ check "date query first" [ "$(sed -n 1p "$SVC_LOG")" = "POST /SUPPORT/Downloads/
 check "customer-id check request, exact" [ "$(sed -n 2p "$SVC_LOG")" = \
     "GET /SUPPORT/Downloads/CheckOZProUpdate.asp?Select=1&CustID=4711&MajorVersion=10.3&ProdSubId=S&MinorVersion=3" ]
 
-if tray_wait_shown 400; then
+if tray_wait_shown 840; then
     e2e_screenshot 3-shown >/dev/null
     figure "slide-in on 1024x768 under Wine: $(awk -v a="$FIRST_VISIBLE" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
     check "stops with its top at 8650 twips = 577 px (y=$(e2e_field "$SHOWN_LINE" y))" [ "$(e2e_field "$SHOWN_LINE" y)" = 577 ]
