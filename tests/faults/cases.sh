@@ -54,7 +54,7 @@ service_case() { # name, expected, must, forbidden, server options (or "none")
     if [ "$1" = none ]; then fault_no_server; else fault_server "$@"; fi
     fault_start
     fault_wait_check 15
-    if matches "$must" shown; then fault_wait_shown 150; fi
+    if matches "$must" shown; then fault_wait_shown 600; fi
     judge "$expected" "$(fault_state)" "$must" "$forbidden"
 }
 NOSHOW='^running, hidden, no Update.INI$'
@@ -79,7 +79,7 @@ update_ini_case() { # name, expected, must, forbidden, preparation
     eval "$prep"
     fault_start
     fault_wait_check 15
-    fault_wait_shown 150
+    fault_wait_shown 600
     judge "$expected" "$(fault_state)" "$must" "$forbidden"
 }
 case_update_ini_empty() { update_ini_case update-ini-empty "shown, today's date written" '^running, shown, Update.INI CurrDate=.+' "$CLEAN" ': >"$APP/Update.INI"'; }
@@ -133,7 +133,7 @@ case_updater_missing() {
     fault_folder --type standalone --cust-id X-10042 --version 10.3.0.3
     rm -f "$APP/KtrLiveUpdate.exe"
     fault_server --latest 1=10.4.0.5
-    fault_start; fault_wait_check 15; fault_wait_shown 150
+    fault_start; fault_wait_check 15; fault_wait_shown 600
     local x y
     x=$(e2e_field "$SHOWN_LINE" x); y=$(e2e_field "$SHOWN_LINE" y)
     xdotool mousemove $((x + 58)) $((y + 119)) sleep 0.3 click 1
@@ -149,7 +149,7 @@ case_folder_blanks_non_ascii() {
     mkdir -p "$APP"; mv "$old/CheckOZProUpdate.exe" "$APP/"; rmdir "$old"
     fault_folder --type standalone --cust-id X-10042 --version 10.3.0.3
     fault_server --latest 1=10.4.0.5
-    fault_start; fault_wait_check 15; fault_wait_shown 150
+    fault_start; fault_wait_check 15; fault_wait_shown 600
     judge "shown, today's date written in that folder" "$(fault_state)" '^running, shown, Update.INI CurrDate=.+' "$CLEAN"
 }
 dpi_case() { # name, dpi
@@ -158,7 +158,7 @@ dpi_case() { # name, dpi
     fault_server --latest 1=10.4.0.5
     fault_start; fault_wait_check 15
     local o tpp cx cy y
-    if fault_wait_shown 200; then
+    if fault_wait_shown 600; then
         tpp=$(awk -v d="$2" 'BEGIN { printf "%d", 1440 / d + 0.5 }')
         cx=$(e2e_field "$SHOWN_LINE" cx); cy=$(e2e_field "$SHOWN_LINE" cy); y=$(e2e_field "$SHOWN_LINE" y)
         o="$(fault_state), client $((cx * tpp))x$((cy * tpp)) twips, top $((y * tpp)) twips"

@@ -18,7 +18,7 @@ OUT=$BUILD/faults; rm -rf "$OUT"; mkdir -p "$OUT"
 echo "running ${#names[@]} fault cases side by side (most wait for the first check, ~2-4 minutes)"
 printf '%s\n' "${names[@]}" | xargs -P "${FAULT_PARALLEL:-8}" -I{} bash -c '
     n={}; f=$(echo "$n" | tr - _)
-    timeout 420 bash -c ". tests/faults/lib-faults.sh; . tests/faults/cases.sh; case_$f" >"'"$OUT"'/$n.out" 2>&1
+    timeout 900 bash -c ". tests/faults/lib-faults.sh; . tests/faults/cases.sh; case_$f" >"'"$OUT"'/$n.out" 2>&1
     grep -q "^ROW|" "'"$OUT"'/$n.out" || echo "ROW|$n|(case ran)|no result: see '"$OUT"'/$n.out|NO" >>"'"$OUT"'/$n.out"'
 rows=$(cat "$OUT"/*.out | grep -a '^ROW|' | cut -d'|' -f2- | sort)
 {
