@@ -9,10 +9,9 @@ BUILD=${BUILD:-$ROOT/build}
 . "$ROOT/tests/e2e/lib.sh"
 
 DEMO=$BUILD/demo
-rm -rf "$DEMO"; mkdir -p "$DEMO"
 PIDS=()
 cleanup() {
-    [ -n "${WINEPREFIX:-}" ] && WINEPREFIX=$WINEPREFIX wineserver -k 2>/dev/null
+    [ -n "${WINEPREFIX:-}" ] && command -v wineserver >/dev/null && WINEPREFIX=$WINEPREFIX wineserver -k 2>/dev/null
     local p; for p in "${PIDS[@]}"; do kill "$p" 2>/dev/null; done
     wait 2>/dev/null
 }
@@ -20,15 +19,34 @@ trap cleanup EXIT
 trap 'echo; echo "stopped."; exit 130' INT TERM
 
 say() { printf '%s\n' "$*"; }
+T0=$(date +%s)
+stage() { say "== [$(( $(date +%s) - T0 )) s] $*"; }
 
-say "== preparing the demo host folder and the update service"
-e2e_template_prefix >/dev/null
+stage "packages for the build"
+"$ROOT/run" packages build || exit 1
+rm -rf "$DEMO"; mkdir -p "$DEMO"
 export WINEPREFIX=$DEMO/prefix
-e2e_new_prefix "$WINEPREFIX"
+
+# Wine installs and its prefix makes its first start while the checker compiles; on a fresh
+# machine both take about as long.
+(
+    "$ROOT/run" packages runtime --no-update && DISPLAY= e2e_boot_prefix "$WINEPREFIX"
+) >"$DEMO/setup.log" 2>&1 &
+SETUP=$!
+PIDS+=($SETUP)
+stage "building the checker and the host stand-ins; Wine is set up beside it (log: $DEMO/setup.log)"
+rm -f "$BUILD/build.log"
+"$ROOT/run" quiet-build hostkit update-server -- CheckOZProUpdate HostStandIn hoststub hoststub-versioned ||
+    exit 1
+wait "$SETUP" || { say "setting up Wine failed:"; cat "$DEMO/setup.log"; exit 1; }
+e2e_prefix_hooks "$WINEPREFIX" >>"$DEMO/setup.log" 2>&1 || { cat "$DEMO/setup.log"; exit 1; }
+
+stage "preparing the demo host folder and the update service"
 APP=$DEMO/OrvelZarnPro
+CAPTION="Orvel Zarn Pro"
 "$NATIVEBIN/hostkit" folder "$APP" --type standalone --version 10.3.0.3 --cust-id X-10042 \
     --application "ORVEL ZARN PRO" >/dev/null
-cp "$WINBIN/CheckOZProUpdate.exe" "$WINBIN/KtrLiveUpdate.exe" "$APP/"
+cp "$WINBIN/CheckOZProUpdate.exe" "$APP/"
 
 "$NATIVEBIN/update-server" --port 0 --latest 1=10.4.0.5 --log "$DEMO/requests.log" >"$DEMO/server.out" 2>&1 &
 PIDS+=($!)
@@ -48,31 +66,53 @@ else
     say "display: $DISPLAY (virtual, 1024x768)"
 fi
 
-say "== starting CheckOZProUpdate.exe in $APP"
+stage "starting CheckOZProUpdate.exe in $APP"
 (cd "$APP" && CHECKER_UPDATE_SERVER=http://127.0.0.1:$PORT WINEDEBUG=-all exec wine "$APP/CheckOZProUpdate.exe") \
     >"$DEMO/checker.out" 2>&1 &
 CHECKER=$!
 PIDS+=($CHECKER)
 start=$(date +%s)
 
-# Progress until the window has slid in and stands topmost.
+# The updater and the window probe are needed only once the window is shown: they build during
+# the wait for the first check.
+"$ROOT/run" quiet-build -- KtrLiveUpdate wininfo >"$DEMO/late-build.out" 2>&1 &
+LATE=$!
+PIDS+=($LATE)
+late_ready() {
+    [ -z "$LATE" ] && return 0
+    wait "$LATE" || { echo; cat "$DEMO/late-build.out"; exit 1; }
+    LATE=""
+    cp "$WINBIN/KtrLiveUpdate.exe" "$APP/"
+}
+
+# Progress until the window has slid in and stands topmost. The slide is followed on the X side
+# (cheap); only a window that has stood still is asked about through Windows' own view, since
+# every Wine probe costs the sliding checker CPU.
+xwin=""; last=""; still=0
 while :; do
     kill -0 "$CHECKER" 2>/dev/null || { echo; say "the checker ended unexpectedly"; exit 1; }
     now=$(date +%s); left=$(awk -v s="$start" -v n="$now" 'BEGIN { l = s + 97.5 - n; if (l < 0) l = 0; printf "%d", l }')
-    line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
-    if [ "$(e2e_field "$line" topmost)" = 1 ]; then break; fi
-    if [ "$(e2e_field "$line" visible)" = 1 ]; then
-        printf '\r  window sliding in: top at %s px ...            ' "$(e2e_field "$line" y)"
+    [ -z "$xwin" ] && xwin=$(xdotool search --onlyvisible --name "^$CAPTION\$" 2>/dev/null | head -n1)
+    if [ -n "$xwin" ]; then
+        geo=$(xdotool getwindowgeometry --shell "$xwin" 2>/dev/null | tr '\n' ' ')
+        if [ "$geo" = "$last" ]; then still=$((still + 1)); else still=0; last=$geo; fi
+        if [ $still -ge 2 ]; then
+            late_ready
+            line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
+            [ "$(e2e_field "$line" topmost)" = 1 ] && break
+        fi
+        printf '\r  window sliding in: top at %s px ...            ' "$(sed -n 's/.*Y=\([-0-9]*\).*/\1/p' <<<"$geo")"
     elif [ "$left" -gt 0 ]; then
         printf '\r  first update check in %3d s                    ' "$left"
     else
         printf '\r  checking with the update service ...          '
     fi
-    [ $((now - start)) -gt 400 ] && { echo; say "no window after 400 s"; exit 1; }
+    [ $((now - start)) -gt 600 ] && { echo; say "no window after 600 s"; exit 1; }
     sleep 1
 done
+late_ready
 echo
-say "window shown after $(( $(date +%s) - start )) s: $line"
+stage "window shown $(( $(date +%s) - start )) s after the start: $line"
 SHOT=$DEMO/shown-window.png
 import -display "$DISPLAY" -window root "$SHOT" 2>/dev/null
 say "screenshot: $SHOT"
@@ -81,7 +121,7 @@ cat "$DEMO/requests.log"
 say "== $APP/Update.INI"
 tr -d '\r' <"$APP/Update.INI"
 
-say "== answering \"&Get Update\""
+stage "answering \"&Get Update\""
 x=$(e2e_field "$line" x); y=$(e2e_field "$line" y)
 # The label lies on the left button bar: 120, 1785 twips inside Picture1, 1500 x 255.
 # Picture1 sits 120 twips above the client area, so the label spans client y 111-128 px.
@@ -93,3 +133,4 @@ for i in $(seq 20); do [ -s "$APP/started.log" ] && break; sleep 0.5; done
 say "== updater start recorded by KtrLiveUpdate.exe (EXE|SHOW-STATE|COMMAND-LINE; 3 = maximized)"
 tr -d '\r' <"$APP/started.log" 2>/dev/null || say "(no started.log)"
 say "screenshot of the shown window: $SHOT"
+stage "done"

@@ -28,20 +28,30 @@ e2e_template_prefix() {
     (
         flock 9
         if [ "${E2E_FRESH:-0}" = 1 ] || [ ! -f "$E2E_TEMPLATE/.ready" ]; then
-            WINEPREFIX=$E2E_TEMPLATE wineserver -k 2>/dev/null || true
-            rm -rf "$E2E_TEMPLATE"
-            WINEPREFIX=$E2E_TEMPLATE wineboot -i >/dev/null 2>&1
-            WINEPREFIX=$E2E_TEMPLATE wineserver -w
-            local hook
-            for hook in "$ROOT"/tests/e2e/template.d/*.sh; do
-                [ -f "$hook" ] || continue
-                WINEPREFIX=$E2E_TEMPLATE bash "$hook" || { echo "template hook failed: $hook"; exit 1; }
-            done
-            WINEPREFIX=$E2E_TEMPLATE wineserver -w
+            e2e_boot_prefix "$E2E_TEMPLATE"
+            e2e_prefix_hooks "$E2E_TEMPLATE" || exit 1
             touch "$E2E_TEMPLATE/.ready"
         fi
     ) 9>"$E2E_ROOT/.template.lock"
     export E2E_TEMPLATE
+}
+
+# A new, empty Wine prefix in $1 (the slow part: Wine's first start).
+e2e_boot_prefix() {
+    WINEPREFIX=$1 wineserver -k 2>/dev/null || true
+    rm -rf "$1"
+    WINEPREFIX=$1 wineboot -i >/dev/null 2>&1
+    WINEPREFIX=$1 wineserver -w
+}
+
+# Runs tests/e2e/template.d/*.sh in the prefix $1 (registering stand-ins and such).
+e2e_prefix_hooks() {
+    local hook
+    for hook in "$ROOT"/tests/e2e/template.d/*.sh; do
+        [ -f "$hook" ] || continue
+        WINEPREFIX=$1 bash "$hook" || { echo "template hook failed: $hook"; return 1; }
+    done
+    WINEPREFIX=$1 wineserver -w
 }
 
 # Copies the template: the large system folders are hard-linked (Wine never writes them).
