@@ -36,9 +36,10 @@ SETUP=$!
 PIDS+=($SETUP)
 stage "building the checker and the host stand-ins; Wine is set up beside it (log: $DEMO/setup.log)"
 rm -f "$BUILD/build.log"
-"$ROOT/run" quiet-build hostkit update-server -- CheckOZProUpdate HostStandIn hoststub hoststub-versioned ||
-    exit 1
+"$ROOT/run" quiet-build hostkit -- CheckOZProUpdate HostStandIn hoststub hoststub-versioned || exit 1
+stage "checker built"
 wait "$SETUP" || { say "setting up Wine failed:"; cat "$DEMO/setup.log"; exit 1; }
+stage "Wine ready"
 e2e_prefix_hooks "$WINEPREFIX" >>"$DEMO/setup.log" 2>&1 || { cat "$DEMO/setup.log"; exit 1; }
 
 stage "preparing the demo host folder and the update service"
@@ -48,10 +49,16 @@ CAPTION="Orvel Zarn Pro"
     --application "ORVEL ZARN PRO" >/dev/null
 cp "$WINBIN/CheckOZProUpdate.exe" "$APP/"
 
-"$NATIVEBIN/update-server" --port 0 --latest 1=10.4.0.5 --log "$DEMO/requests.log" >"$DEMO/server.out" 2>&1 &
-PIDS+=($!)
-for i in $(seq 50); do grep -q listening "$DEMO/server.out" 2>/dev/null && break; sleep 0.1; done
-PORT=$(sed -n 's/.*127\.0\.0\.1:\([0-9]*\).*/\1/p' "$DEMO/server.out" | head -n1)
+# The service is first asked 97.5 s after the start, so it builds and starts during that wait;
+# the checker is told its address now.
+free_port() {
+    local p
+    for p in $(shuf -i 20000-60000 -n 50); do
+        (exec 3<>"/dev/tcp/127.0.0.1/$p") 2>/dev/null || { echo "$p"; return 0; }
+    done
+    return 1
+}
+PORT=$(free_port) || { say "no free port on 127.0.0.1"; exit 1; }
 say "update service: http://127.0.0.1:$PORT (offers 10.4.0.5 for product 1)"
 
 if [ -n "${DISPLAY:-}" ] && xdpyinfo >/dev/null 2>&1; then
@@ -73,16 +80,21 @@ CHECKER=$!
 PIDS+=($CHECKER)
 start=$(date +%s)
 
-# The updater and the window probe are needed only once the window is shown: they build during
-# the wait for the first check.
-"$ROOT/run" quiet-build -- KtrLiveUpdate wininfo >"$DEMO/late-build.out" 2>&1 &
+# The service, the updater and the window probe build during the wait for the first check.
+"$ROOT/run" quiet-build update-server -- KtrLiveUpdate wininfo >"$DEMO/late-build.out" 2>&1 &
 LATE=$!
 PIDS+=($LATE)
-late_ready() {
-    [ -z "$LATE" ] && return 0
+SERVER=""
+server_ready() {
+    [ -n "$SERVER" ] && return 0
     wait "$LATE" || { echo; cat "$DEMO/late-build.out"; exit 1; }
-    LATE=""
     cp "$WINBIN/KtrLiveUpdate.exe" "$APP/"
+    "$NATIVEBIN/update-server" --port "$PORT" --latest 1=10.4.0.5 --log "$DEMO/requests.log" \
+        >"$DEMO/server.out" 2>&1 &
+    SERVER=$!
+    PIDS+=($SERVER)
+    for i in $(seq 50); do grep -q listening "$DEMO/server.out" 2>/dev/null && return 0; sleep 0.1; done
+    echo; say "the update service did not start:"; cat "$DEMO/server.out"; exit 1
 }
 
 # Progress until the window has slid in and stands topmost. The slide is followed on the X side
@@ -92,12 +104,14 @@ xwin=""; last=""; still=0
 while :; do
     kill -0 "$CHECKER" 2>/dev/null || { echo; say "the checker ended unexpectedly"; exit 1; }
     now=$(date +%s); left=$(awk -v s="$start" -v n="$now" 'BEGIN { l = s + 97.5 - n; if (l < 0) l = 0; printf "%d", l }')
+    # The service starts once built, and at the latest just before the first check.
+    if [ -z "$SERVER" ] && { ! kill -0 "$LATE" 2>/dev/null || [ "$left" -le 5 ]; }; then server_ready; fi
     [ -z "$xwin" ] && xwin=$(xdotool search --onlyvisible --name "^$CAPTION\$" 2>/dev/null | head -n1)
     if [ -n "$xwin" ]; then
         geo=$(xdotool getwindowgeometry --shell "$xwin" 2>/dev/null | tr '\n' ' ')
         if [ "$geo" = "$last" ]; then still=$((still + 1)); else still=0; last=$geo; fi
         if [ $still -ge 2 ]; then
-            late_ready
+            server_ready
             line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
             [ "$(e2e_field "$line" topmost)" = 1 ] && break
         fi
@@ -110,7 +124,6 @@ while :; do
     [ $((now - start)) -gt 600 ] && { echo; say "no window after 600 s"; exit 1; }
     sleep 1
 done
-late_ready
 echo
 stage "window shown $(( $(date +%s) - start )) s after the start: $line"
 SHOT=$DEMO/shown-window.png
