@@ -114,17 +114,16 @@ done
 echo "== one check that finds an update: requests and slide-in (1024x768)"
 : >"$SCEN/requests.log"
 server --latest 1=10.4.0.5
+rm -f "$APP/Update.INI"
 launch CheckOZProUpdate-bench.exe
-slide_start=""; slide=NaN
-for i in $(seq 1200); do
-    line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
-    if [ -z "$slide_start" ] && [ "$(e2e_field "$line" visible)" = 1 ]; then
-        slide_start=$(date +%s.%N)
-        requests=$(grep -c . "$SCEN/requests.log")
-    fi
-    if [ -n "$slide_start" ] && [ "$(e2e_field "$line" topmost)" = 1 ]; then slide=$(e2e_since "$slide_start"); break; fi
-    sleep 0.1
-done
+# From the first step to the last move, followed on the X side so that the probe does not slow
+# the slide it measures (to the half-second poll).
+slide=NaN
+CHECKER_PID=$PID
+if e2e_follow_slide 900 CheckOZProUpdate-bench.exe; then
+    slide=$(awk -v a="$SLIDE_BEGAN_AT" -v b="$SLIDE_MOVED_AT" 'BEGIN { printf "%.1f", b - a }')
+fi
+requests=$(grep -c . "$SCEN/requests.log")
 
 size() { stat -c %s "$1"; }
 imports() { x86_64-w64-mingw32-objdump -p "$1" | sed -n 's/.*DLL Name: //p' | tr 'A-Z' 'a-z' | sort -u | tr '\n' ' '; }

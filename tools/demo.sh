@@ -44,7 +44,6 @@ e2e_prefix_hooks "$WINEPREFIX" >>"$DEMO/setup.log" 2>&1 || { cat "$DEMO/setup.lo
 
 stage "preparing the demo host folder and the update service"
 APP=$DEMO/OrvelZarnPro
-CAPTION="Orvel Zarn Pro"
 "$NATIVEBIN/hostkit" folder "$APP" --type standalone --version 10.3.0.3 --cust-id X-10042 \
     --application "ORVEL ZARN PRO" >/dev/null
 cp "$WINBIN/CheckOZProUpdate.exe" "$APP/"
@@ -97,33 +96,27 @@ server_ready() {
     echo; say "the update service did not start:"; cat "$DEMO/server.out"; exit 1
 }
 
-# Progress until the window has slid in and stands topmost. The slide is followed on the X side
-# (cheap); only a window that has stood still is asked about through Windows' own view, since
-# every Wine probe costs the sliding checker CPU.
-xwin=""; last=""; still=0
-while :; do
-    kill -0 "$CHECKER" 2>/dev/null || { echo; say "the checker ended unexpectedly"; exit 1; }
-    now=$(date +%s); left=$(awk -v s="$start" -v n="$now" 'BEGIN { l = s + 97.5 - n; if (l < 0) l = 0; printf "%d", l }')
+# Progress until the window has slid in and stands topmost.
+demo_progress() {
+    local left
+    left=$(awk -v s="$start" -v n="$(date +%s)" 'BEGIN { l = s + 97.5 - n; if (l < 0) l = 0; printf "%d", l }')
     # The service starts once built, and at the latest just before the first check.
     if [ -z "$SERVER" ] && { ! kill -0 "$LATE" 2>/dev/null || [ "$left" -le 5 ]; }; then server_ready; fi
-    [ -z "$xwin" ] && xwin=$(xdotool search --onlyvisible --name "^$CAPTION\$" 2>/dev/null | head -n1)
-    if [ -n "$xwin" ]; then
-        geo=$(xdotool getwindowgeometry --shell "$xwin" 2>/dev/null | tr '\n' ' ')
-        if [ "$geo" = "$last" ]; then still=$((still + 1)); else still=0; last=$geo; fi
-        if [ $still -ge 2 ]; then
-            server_ready
-            line=$(e2e_wine "$WINBIN/wininfo.exe" --class CheckOZProUpdateMain)
-            [ "$(e2e_field "$line" topmost)" = 1 ] && break
-        fi
-        printf '\r  window sliding in: top at %s px ...            ' "$(sed -n 's/.*Y=\([-0-9]*\).*/\1/p' <<<"$geo")"
+    if [ -n "$SLIDE_TOP" ]; then
+        printf '\r  window sliding in: top at %s px ...            ' "$SLIDE_TOP"
     elif [ "$left" -gt 0 ]; then
         printf '\r  first update check in %3d s                    ' "$left"
     else
         printf '\r  checking with the update service ...          '
     fi
-    [ $((now - start)) -gt 600 ] && { echo; say "no window after 600 s"; exit 1; }
-    sleep 1
-done
+}
+CHECKER_PID=$CHECKER
+if ! E2E_SLIDE_HOOK=demo_progress e2e_follow_slide 600; then
+    echo
+    if kill -0 "$CHECKER" 2>/dev/null; then say "no window after 600 s"; else say "the checker ended unexpectedly"; fi
+    exit 1
+fi
+line=$SHOWN_LINE
 echo
 stage "window shown $(( $(date +%s) - start )) s after the start: $line"
 SHOT=$DEMO/shown-window.png

@@ -150,6 +150,49 @@ e2e_wait_window() {
     done
 }
 
+# Follows the checker's slide-in from the X side, which costs the sliding checker next to
+# nothing (a Wine probe per poll would slow the very slide it watches), and asks Windows' own
+# view only once the window has stood still for 1.5 s.
+#   e2e_follow_slide SECONDS [EXE-NAME]     (default CheckOZProUpdate.exe)
+# Sets SLIDE_SEEN_AT (first on screen: Wine maps no window that lies wholly off the screen),
+# SLIDE_MOVED_AT (last move) and SLIDE_BEGAN_AT (when $APP/Update.INI was written, which the
+# display does just before the first step) as `date +%s.%N` stamps, SLIDE_TOP (pixels, while
+# mapped) and SHOWN_LINE (the wininfo line once it stands topmost).
+# Calls the function named in E2E_SLIDE_HOOK after every poll. Returns 1 when the checker has
+# ended or the time is up.
+e2e_follow_slide() {
+    local deadline=$(($(date +%s) + $1)) exe=${2:-CheckOZProUpdate.exe}
+    local xwin="" geo last="" now probe_at=0 line
+    exe=$(tr 'A-Z' 'a-z' <<<"${exe//./\\.}")
+    SLIDE_SEEN_AT=""; SLIDE_MOVED_AT=""; SLIDE_TOP=""; SHOWN_LINE=""
+    while :; do
+        e2e_running || return 1
+        # Only the main window of the checker is mapped during a slide (Wine names the X
+        # window's class after the executable).
+        [ -z "$xwin" ] && xwin=$(xdotool search --onlyvisible --classname "^$exe\$" 2>/dev/null | head -n1)
+        if [ -n "$xwin" ]; then
+            now=$(date +%s.%N)
+            [ -z "$SLIDE_SEEN_AT" ] && { SLIDE_SEEN_AT=$now; SLIDE_MOVED_AT=$now; }
+            geo=$(xdotool getwindowgeometry --shell "$xwin" 2>/dev/null | tr '\n' ' ')
+            SLIDE_TOP=$(sed -n 's/.*Y=\([-0-9]*\).*/\1/p' <<<"$geo")
+            if [ "$geo" != "$last" ]; then
+                last=$geo; SLIDE_MOVED_AT=$now
+            elif awk -v m="$SLIDE_MOVED_AT" -v p="$probe_at" -v n="$now" 'BEGIN { exit !(n - m >= 1.5 && n >= p) }'; then
+                line=$(e2e_windows --class CheckOZProUpdateMain)
+                if [ "$(e2e_field "$line" topmost)" = 1 ]; then
+                    SHOWN_LINE=$line
+                    SLIDE_BEGAN_AT=$(stat -c %.9Y "$APP/Update.INI" 2>/dev/null || echo "$SLIDE_SEEN_AT")
+                    return 0
+                fi
+                probe_at=$(awk -v n="$now" 'BEGIN { printf "%.3f", n + 1.5 }')
+            fi
+        fi
+        [ -n "${E2E_SLIDE_HOOK:-}" ] && "$E2E_SLIDE_HOOK"
+        [ "$(date +%s)" -ge "$deadline" ] && return 1
+        sleep 0.5
+    done
+}
+
 e2e_screenshot() { # $1 name -> $ARTEFACTS/<scenario>-<name>.png
     local f=$ARTEFACTS/$E2E_NAME-$1.png
     import -display "$DISPLAY" -window root "$f" 2>/dev/null && echo "$f"

@@ -70,15 +70,7 @@ fault_answer_box() {
 }
 
 # Waits up to $1 seconds for the window to stand topmost (the slide-in has ended).
-fault_wait_shown() {
-    local deadline=$(($(date +%s) + $1)) line
-    while e2e_running && [ "$(date +%s)" -lt "$deadline" ]; do
-        line=$(e2e_windows --class CheckOZProUpdateMain)
-        [ "$(e2e_field "$line" topmost)" = 1 ] && { SHOWN_LINE=$line; return 0; }
-        sleep 1
-    done
-    return 1
-}
+fault_wait_shown() { e2e_follow_slide "$1"; }
 
 # A short description of the state the user and the host see.
 fault_state() {

@@ -20,25 +20,17 @@ tray_label() { e2e_windows --class CheckOZProUpdateMain --children | grep -E "^ 
 tray_title() { sed -n 's/.* title=//p' <<<"$1"; }
 
 # tray_wait_shown SECONDS: waits until the main window stands visible and topmost. Sets
-# SHOWN_LINE, and FIRST_VISIBLE / SHOWN_AT (date +%s.%N) and a screenshot while it slides.
+# SHOWN_LINE, SLIDE_BEGAN_AT / SHOWN_AT (date +%s.%N: first step, last move) and takes a
+# screenshot while it slides.
 tray_wait_shown() {
-    local deadline=$(($(date +%s) + $1)) line shot=0
-    FIRST_VISIBLE=""
-    while :; do
-        e2e_running || return 1
-        line=$(tray_main)
-        if [ "$(e2e_field "$line" visible)" = 1 ]; then
-            [ -z "$FIRST_VISIBLE" ] && FIRST_VISIBLE=$(date +%s.%N)
-            if [ "$(e2e_field "$line" topmost)" = 1 ]; then
-                SHOWN_AT=$(date +%s.%N); SHOWN_LINE=$line; return 0
-            fi
-            if [ $shot = 0 ] && [ "$(e2e_field "$line" y)" -lt 740 ]; then
-                e2e_screenshot 2-sliding >/dev/null; shot=1
-            fi
-        fi
-        [ "$(date +%s)" -ge "$deadline" ] && return 1
-        sleep 1 # each probe is a Wine process start: it would slow the slide it watches
-    done
+    TRAY_SHOT=0
+    E2E_SLIDE_HOOK=tray_slide_shot e2e_follow_slide "$1" || return 1
+    SHOWN_AT=$SLIDE_MOVED_AT
+}
+tray_slide_shot() {
+    if [ $TRAY_SHOT = 0 ] && [ -n "$SLIDE_TOP" ] && [ "$SLIDE_TOP" -lt 740 ]; then
+        e2e_screenshot 2-sliding >/dev/null; TRAY_SHOT=1
+    fi
 }
 
 # tray_wait_lines FILE N SECONDS: until FILE has at least N lines.

@@ -10,7 +10,7 @@ tray_start
 # Paced by 4.85 million message-pump calls: on a loaded 2-core machine this takes minutes.
 if tray_wait_shown 840; then
     e2e_screenshot 3-shown >/dev/null
-    figure "slide-in on 1152x864 under Wine: $(awk -v a="$FIRST_VISIBLE" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
+    figure "slide-in on 1152x864 under Wine: $(awk -v a="$SLIDE_BEGAN_AT" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
     check "stops at 10150 twips = 677 px (y=$(e2e_field "$SHOWN_LINE" y))" [ "$(e2e_field "$SHOWN_LINE" y)" = 677 ]
     check "left edge 17280-3435-50 twips = 920 px (x=$(e2e_field "$SHOWN_LINE" x))" [ "$(e2e_field "$SHOWN_LINE" x)" = 920 ]
     check "topmost" [ "$(e2e_field "$SHOWN_LINE" topmost)" = 1 ]

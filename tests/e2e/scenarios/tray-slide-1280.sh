@@ -9,7 +9,7 @@ tray_folder
 tray_start
 if tray_wait_shown 840; then
     e2e_screenshot 3-shown >/dev/null
-    figure "slide-in on 1280x1024 under Wine: $(awk -v a="$FIRST_VISIBLE" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
+    figure "slide-in on 1280x1024 under Wine: $(awk -v a="$SLIDE_BEGAN_AT" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
     check "stops at 6150 twips = 410 px (y=$(e2e_field "$SHOWN_LINE" y))" [ "$(e2e_field "$SHOWN_LINE" y)" = 410 ]
     check "left edge 19200-3435-50 twips = 1048 px (x=$(e2e_field "$SHOWN_LINE" x))" [ "$(e2e_field "$SHOWN_LINE" x)" = 1048 ]
     check "topmost" [ "$(e2e_field "$SHOWN_LINE" topmost)" = 1 ]

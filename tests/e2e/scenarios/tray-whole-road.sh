@@ -26,7 +26,7 @@ check "customer-id check request, exact" [ "$(sed -n 2p "$SVC_LOG")" = \
 
 if tray_wait_shown 840; then
     e2e_screenshot 3-shown >/dev/null
-    figure "slide-in on 1024x768 under Wine: $(awk -v a="$FIRST_VISIBLE" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
+    figure "slide-in on 1024x768 under Wine: $(awk -v a="$SLIDE_BEGAN_AT" -v b="$SHOWN_AT" 'BEGIN{printf "%.1f", b-a}') s"
     check "stops with its top at 8650 twips = 577 px (y=$(e2e_field "$SHOWN_LINE" y))" [ "$(e2e_field "$SHOWN_LINE" y)" = 577 ]
     check "left edge 15360-3435-50 = 11875 twips = 792 px (x=$(e2e_field "$SHOWN_LINE" x))" [ "$(e2e_field "$SHOWN_LINE" x)" = 792 ]
     check "client area 229 x 142 px ($(e2e_field "$SHOWN_LINE" cx) x $(e2e_field "$SHOWN_LINE" cy))" \
